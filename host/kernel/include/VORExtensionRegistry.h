@@ -1,0 +1,39 @@
+// Registry of extensions per (late type, interface). A lookup walks the late-type chain and,
+// when nothing is registered, loads the module that the module dictionary names for it.
+#pragma once
+
+#include <string>
+
+#include "VORExtension.h"
+
+using VORExtensionFactory = VORExtension* (*)();
+
+namespace VORExtensionRegistry {
+void Register(const std::string& lateType, const VORInterfaceId& iid, VORExtensionFactory factory,
+              VORExtensionKind kind);
+void Unregister(const std::string& lateType, const VORInterfaceId& iid);
+
+struct Entry {
+  VORExtensionFactory factory = nullptr;
+  VORExtensionKind kind = VORExtensionKind::Data;
+};
+// Null factory when no extension answers iid for lateType or its ancestors.
+Entry Find(const std::string& lateType, const VORInterfaceId& iid);
+
+// Reads the module dictionary: lines "<late type> <interface> <module>", '#' starts a comment.
+// Returns false (and keeps the previous dictionary) when the file cannot be read.
+bool LoadDictionary(const std::string& path);
+// Looks for "VORModules.dic" along VORStartupPath; quiet when there is none.
+void LoadDictionaryFromStartupPath();
+void ClearDictionary();
+// Drops cached look-up answers (late types changed).
+void ForgetAnswers();
+}  // namespace VORExtensionRegistry
+
+// Registers an extension class at module load time.
+#define VOR_REGISTER_EXTENSION(Class, LateType, Interface, Kind)                          \
+  static const bool vorRegistered_##Class##_##Interface = [] {                            \
+    VORExtensionRegistry::Register(                                                       \
+        LateType, Interface::IID(), []() -> VORExtension* { return new Class(); }, Kind); \
+    return true;                                                                          \
+  }()

@@ -1,0 +1,84 @@
+#include <gtest/gtest.h>
+
+#include "TestInterfaces.h"
+
+namespace {
+
+class Square : public ITestShape, public ITestLabel {
+  VOR_DECLARE_CLASS(Square, VORBaseUnknown)
+ public:
+  int Corners() const override { return 4; }
+  const char* Label() const override { return "square"; }
+};
+
+class ColouredSquare : public Square {
+  VOR_DECLARE_CLASS(ColouredSquare, Square)
+};
+
+class Circle : public ITestLabel {
+  VOR_DECLARE_CLASS(Circle, VORBaseUnknown)
+ public:
+  const char* Label() const override { return "circle"; }
+};
+
+class ComponentModelTest : public ::testing::Test {
+ protected:
+  void SetUp() override { _live = VORBaseUnknown::LiveInstances(); }
+  void TearDown() override {
+    EXPECT_EQ(VORBaseUnknown::LiveInstances(), _live) << "leaked objects";
+  }
+  long _live = 0;
+};
+
+TEST_F(ComponentModelTest, HandleCastAnswersImplementedInterfacesAndIsNullOtherwise) {
+  ITestLabel_var circle = ITestLabel_var::Adopt(new Circle());
+  ITestShape_var shape(circle);
+  EXPECT_EQ(shape, NULL_var);
+  EXPECT_FALSE(shape);
+
+  ITestLabel_var square = ITestLabel_var::Adopt(new Square());
+  ITestShape_var squareShape(square);
+  ASSERT_TRUE(squareShape);
+  EXPECT_EQ(squareShape->Corners(), 4);
+  // Two interfaces of one object are the same object.
+  EXPECT_TRUE(squareShape == square);
+  EXPECT_FALSE(square == circle);
+}
+
+TEST_F(ComponentModelTest, HandlesShareOneReferenceCountAcrossInterfaces) {
+  Square* raw = new Square();
+  {
+    ITestShape_var shape = ITestShape_var::Adopt(raw);
+    EXPECT_EQ(raw->RefCount(), 1u);
+    ITestLabel_var label(shape);
+    VORBaseUnknown_var unknown(label);
+    EXPECT_EQ(raw->RefCount(), 3u);
+    label = NULL_var;
+    EXPECT_EQ(raw->RefCount(), 2u);
+    ITestShape_var moved(std::move(shape));
+    EXPECT_EQ(raw->RefCount(), 2u);
+  }
+  // The last handle deleted it; the fixture checks no instance is left.
+}
+
+TEST_F(ComponentModelTest, NullHandlesCastToNull) {
+  ITestShape_var none;
+  ITestLabel_var stillNone(none);
+  EXPECT_EQ(stillNone, nullptr);
+  VORBaseUnknown_var unknown(static_cast<VORBaseUnknown*>(nullptr));
+  EXPECT_FALSE(unknown);
+}
+
+TEST_F(ComponentModelTest, MetaObjectsFollowClassInheritance) {
+  VORBaseUnknown_var object = VORBaseUnknown_var::Adopt(new ColouredSquare());
+  EXPECT_STREQ(object->IsA(), "ColouredSquare");
+  EXPECT_TRUE(object->IsAKindOf("Square"));
+  EXPECT_TRUE(object->IsAKindOf(Square::ClassName()));
+  EXPECT_TRUE(object->IsAKindOf("VORBaseUnknown"));
+  EXPECT_FALSE(object->IsAKindOf("Circle"));
+  EXPECT_EQ(ColouredSquare::MetaObject()->Base(), Square::MetaObject());
+  // The late type defaults to the class name.
+  EXPECT_STREQ(object->GetLateType(), "ColouredSquare");
+}
+
+}  // namespace
