@@ -54,7 +54,8 @@ static Entry Resolve(const std::string& lateType, const std::string& name);
 
 Entry Find(const std::string& lateType, const VORInterfaceId& iid) {
   Key key{lateType, std::string(iid.name)};
-  if (auto it = Answers().find(key); it != Answers().end()) return it->second;
+  if (auto it = Answers().find(key); it != Answers().end())
+    return it->second;
   Entry answer = Resolve(lateType, key.second);
   Answers()[std::move(key)] = answer;
   return answer;
@@ -102,7 +103,9 @@ void LoadDictionaryFromStartupPath() {
     LoadDictionary(path.ConvertToUTF8());
 }
 
-void ForgetAnswers() { Answers().clear(); }
+void ForgetAnswers() {
+  Answers().clear();
+}
 
 void ClearDictionary() {
   Dictionary().clear();

@@ -1,0 +1,49 @@
+#include "PfvCommand.h"
+
+#include <unistd.h>
+
+#include <algorithm>
+#include <clocale>
+#include <cstdlib>
+#include <filesystem>
+
+#include "VORModuleLoader.h"
+
+std::vector<PfvCommand>& PfvCommands() {
+  static std::vector<PfvCommand> commands;
+  return commands;
+}
+
+bool PfvRegisterCommand(PfvCommand command) {
+  auto& commands = PfvCommands();
+  auto at = std::lower_bound(commands.begin(), commands.end(), command.name,
+                             [](const PfvCommand& c, const std::string& n) { return c.name < n; });
+  commands.insert(at, std::move(command));
+  return true;
+}
+
+void PfvInitialiseProcess(const char* argv0) {
+  // Parser strings are transcoded with the locale: make it UTF-8 whatever the user's is.
+  if (std::setlocale(LC_ALL, "") == nullptr || std::setlocale(LC_CTYPE, "C.UTF-8") == nullptr) {
+    std::setlocale(LC_CTYPE, "C.UTF-8");
+  }
+  namespace fs = std::filesystem;
+  std::error_code ec;
+  fs::path exe = fs::canonical("/proc/self/exe", ec);
+  if (ec)
+    exe = fs::absolute(argv0 ? argv0 : "pfv", ec);
+  const fs::path binDir = exe.parent_path();
+  // Built tree: <build>/bin/pfv, modules in <build>/lib, sources two levels up.
+  const fs::path libDir = binDir.parent_path() / "lib";
+  VORModuleLoader::SetSearchPath(libDir.string());
+  if (std::getenv("VORStartupPath") == nullptr) {
+    for (const fs::path& candidate :
+         {binDir.parent_path().parent_path().parent_path() / "resources",
+          binDir.parent_path() / "share" / "pfv" / "resources"}) {
+      if (fs::is_directory(candidate, ec)) {
+        ::setenv("VORStartupPath", candidate.string().c_str(), 1);
+        break;
+      }
+    }
+  }
+}

@@ -1,0 +1,82 @@
+#include <gtest/gtest.h>
+
+#include <vector>
+
+#include "VOREventPublisher.h"
+#include "VORHandle.h"
+
+namespace {
+
+class ActivityChanged : public VORNotification {
+  VOR_DECLARE_CLASS(ActivityChanged, VORNotification)
+};
+class ChildAdded : public ActivityChanged {
+  VOR_DECLARE_CLASS(ChildAdded, ActivityChanged)
+};
+
+struct Recorder {
+  std::vector<std::string> calls;
+  VORCallbackFunction Callback(const std::string& tag) {
+    return [this, tag](VORBaseUnknown*, const std::string& event, VORNotification*, void*,
+                       VORCallbackId) { calls.push_back(tag + ":" + event); };
+  }
+};
+
+TEST(EventPublisherTest, CallbacksFireByEventNameOrNotificationKindInRegistrationOrder) {
+  VORHandle<VOREventPublisher> publisher =
+      VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
+  Recorder r;
+  publisher->AddCallback("ActivityChanged", r.Callback("kind"));
+  publisher->AddCallback("DISPATCHER_SPP_VIEWS_CHANGE", r.Callback("views"));
+  publisher->AddCallback("ChildAdded", r.Callback("exact"));
+
+  VORHandle<ChildAdded> added = VORHandle<ChildAdded>::Adopt(new ChildAdded());
+  EXPECT_EQ(publisher->Dispatch(added), 2);
+  EXPECT_EQ(publisher->Dispatch("DISPATCHER_SPP_VIEWS_CHANGE", added), 3);
+  VORHandle<ActivityChanged> plain = VORHandle<ActivityChanged>::Adopt(new ActivityChanged());
+  EXPECT_EQ(publisher->Dispatch(plain), 1);
+  EXPECT_EQ(r.calls, (std::vector<std::string>{
+                         "kind:ChildAdded", "exact:ChildAdded", "kind:DISPATCHER_SPP_VIEWS_CHANGE",
+                         "views:DISPATCHER_SPP_VIEWS_CHANGE", "exact:DISPATCHER_SPP_VIEWS_CHANGE",
+                         "kind:ActivityChanged"}));
+}
+
+TEST(EventPublisherTest, RemovalDuringDispatchSilencesAtOnceAndAdditionsWaitForTheNextEvent) {
+  VORHandle<VOREventPublisher> publisher =
+      VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
+  Recorder r;
+  VORCallbackId second = 0;
+  publisher->AddCallback(
+      "E", [&](VORBaseUnknown*, const std::string&, VORNotification*, void*, VORCallbackId self) {
+        r.calls.push_back("first");
+        publisher->RemoveCallback(second);
+        publisher->RemoveCallback(self);
+        publisher->AddCallback("E", r.Callback("late"));
+      });
+  second = publisher->AddCallback("E", r.Callback("second"));
+  EXPECT_EQ(publisher->Dispatch("E"), 1);
+  EXPECT_EQ(r.calls, std::vector<std::string>{"first"});
+  EXPECT_EQ(publisher->CallbackCount(), 1);
+  publisher->Dispatch("E");
+  EXPECT_EQ(r.calls.back(), "late:E");
+  EXPECT_FALSE(publisher->RemoveCallback(second));
+}
+
+TEST(EventPublisherTest, SubscriberTagsRemoveAllOfOneSubscriberAndIdsAreUnique) {
+  VORHandle<VOREventPublisher> a = VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
+  VORHandle<VOREventPublisher> b = VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
+  int me = 0, other = 0;
+  Recorder r;
+  VORCallbackId id1 = a->AddCallback("E", r.Callback("1"), nullptr, &me);
+  VORCallbackId id2 = b->AddCallback("E", r.Callback("2"), nullptr, &me);
+  a->AddCallback("E", r.Callback("3"), nullptr, &other);
+  EXPECT_NE(id1, id2);
+  EXPECT_NE(id1, 0u);
+  EXPECT_FALSE(a->RemoveCallback(id2)) << "an id of another publisher";
+  EXPECT_EQ(a->RemoveCallbacksOf(&me), 1);
+  a->Dispatch("E");
+  EXPECT_EQ(r.calls, std::vector<std::string>{"3:E"});
+  EXPECT_EQ(a->AddCallback("E", nullptr), 0u);
+}
+
+}  // namespace
