@@ -43,9 +43,9 @@ void BM_QueryDataExtensionThroughLateTypeChain(benchmark::State& state) {
   VORLateTypes::Declare("BenchActivity", "");
   VORLateTypes::Declare("BenchPhysical", "BenchActivity");
   VORLateTypes::Declare("BenchStation", "BenchPhysical");
-  VORExtensionRegistry::Register("BenchActivity", IBenchExtra::IID(),
-                                 []() -> VORExtension* { return new ExtraExtension(); },
-                                 VORExtensionKind::Data);
+  VORExtensionRegistry::Register(
+      "BenchActivity", IBenchExtra::IID(), []() -> VORExtension* { return new ExtraExtension(); },
+      VORExtensionKind::Data);
   VORBaseUnknown_var object = VORBaseUnknown_var::Adopt(new Shape());
   for (auto _ : state) {
     VORHandle<IBenchExtra> extra(object);
@@ -66,17 +66,21 @@ BENCHMARK(BM_QueryMissingInterface);
 
 void BM_ListLocateByIdentity(benchmark::State& state) {
   VORListValVORBaseUnknown_var list;
-  for (int i = 0; i < state.range(0); ++i) list.Append(VORBaseUnknown_var::Adopt(new Shape()));
+  for (int i = 0; i < state.range(0); ++i)
+    list.Append(VORBaseUnknown_var::Adopt(new Shape()));
   VORBaseUnknown_var last = list[list.Size()];
-  for (auto _ : state) benchmark::DoNotOptimize(list.Locate(last));
+  for (auto _ : state)
+    benchmark::DoNotOptimize(list.Locate(last));
   state.SetComplexityN(state.range(0));
 }
 BENCHMARK(BM_ListLocateByIdentity)->Range(16, 16384)->Complexity();
 
 void BM_ListRemoveDuplicates(benchmark::State& state) {
   VORListValVORBaseUnknown_var base;
-  for (int i = 0; i < state.range(0); ++i) base.Append(VORBaseUnknown_var::Adopt(new Shape()));
-  for (int i = 1; i <= state.range(0); i += 2) base.Append(base[i]);
+  for (int i = 0; i < state.range(0); ++i)
+    base.Append(VORBaseUnknown_var::Adopt(new Shape()));
+  for (int i = 1; i <= state.range(0); i += 2)
+    base.Append(base[i]);
   for (auto _ : state) {
     VORListValVORBaseUnknown_var copy = base;
     copy.RemoveDuplicates();
