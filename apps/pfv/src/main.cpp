@@ -29,11 +29,13 @@ int main(int argc, char** argv) {
     return 0;
   }
   for (const PfvCommand& c : PfvCommands()) {
-    if (c.name == first) return c.run(std::vector<std::string>(argv + 2, argv + argc));
+    if (c.name == first)
+      return c.run(std::vector<std::string>(argv + 2, argv + argc));
   }
   // The window, when it is built in, registers itself as "gui".
   for (const PfvCommand& c : PfvCommands()) {
-    if (c.name == "gui") return c.run(std::vector<std::string>(argv + 1, argv + argc));
+    if (c.name == "gui")
+      return c.run(std::vector<std::string>(argv + 1, argv + argc));
   }
   if (!first.empty() && first[0] == '-') {
     std::fprintf(stderr, "pfv: unknown option %s\n", first.c_str());
