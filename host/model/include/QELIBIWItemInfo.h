@@ -1,0 +1,39 @@
+// Item bookkeeping of a body-in-white station or grouping activity, computed from the model
+// on every call. Terms, for an activity A with children C (activities only):
+//  - A's own items: the items assigned to A (VORISPPItemMgt, mode AssignedHere).
+//  - produced items: the items of the product outputs of A and of the children.
+//  - consumed items: the items of the product inputs of A and of the children.
+// The two item lists are what the output list shows: the first list holds what A produces
+// (outputs of A itself), the second what A's children produce that is not consumed again
+// inside A (the sub-results a group hands on). For a station without children the second
+// list is empty.
+#pragma once
+
+#include "VORHandle.h"
+#include "VORLists.h"
+
+class QELIBIWItemInfo : public virtual VORBaseUnknown {
+  VOR_DECLARE_INTERFACE(QELIBIWItemInfo)
+ public:
+  // New lists the caller deletes.
+  // The product outputs of the activity itself ("ProductOutput" objects).
+  virtual HRESULT GetFirstItemList(VORListValVORBaseUnknown_var*& items) = 0;
+  // Product outputs of the child activities whose item no child or the activity consumes.
+  virtual HRESULT GetSecondItemList(VORListValVORBaseUnknown_var*& items) = 0;
+  // The child activities (and for a station without children, the activity itself).
+  virtual HRESULT GetActivityList(VORListValVORBaseUnknown_var*& activities) = 0;
+  // The items consumed inside: the items of the product inputs of the activity and its
+  // children, without duplicates.
+  virtual HRESULT GetConsumedItems(VORListValVORBaseUnknown_var*& items) = 0;
+  // The product inputs and outputs of the activity itself (what an item exchange may replace).
+  virtual HRESULT GetReplaceableProductIOs(VORListValVORBaseUnknown_var*& productIOs) = 0;
+  // True when productOutput is listed in the first or second list.
+  virtual bool IsListedOutput(VORBaseUnknown* productOutput) = 0;
+  // Whether a product output of this activity may be handed to target: target must be a
+  // station, grouping or loading activity under the same root, and not this activity.
+  virtual bool AcceptsOutputTransfer(VORBaseUnknown* productOutput, VORBaseUnknown* target) = 0;
+  // Whether target is on the father chain of this activity up to the root (both included),
+  // or a descendant of it: moves stay inside one branch of the tree.
+  virtual bool IsInHierarchyOf(VORBaseUnknown* target) = 0;
+};
+VOR_DECLARE_HANDLE(QELIBIWItemInfo);
