@@ -1,0 +1,185 @@
+#include "VORSelectionSet.h"
+
+#include <algorithm>
+
+#include "VORCSO.h"
+#include "VORHSO.h"
+#include "VORISO.h"
+#include "VORPSO.h"
+#include "VORSelectionContext.h"
+
+VORSelectionSet::VORSelectionSet()
+    : _publisher(VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher(this))) {}
+
+VORSelectionSet::~VORSelectionSet() = default;
+
+VORPathElement* VORSelectionSet::GetElement(int position) const {
+  if (position < 1 || position > _elements.Size())
+    return nullptr;
+  return static_cast<VORPathElement*>(_elements[position].get());
+}
+
+VORPathElement* VORSelectionSet::NextElement() {
+  if (_cursor >= _elements.Size())
+    return nullptr;
+  return GetElement(++_cursor);
+}
+
+int VORSelectionSet::LocateEqual(const VORPathElement& path) const {
+  for (int i = 1; i <= _elements.Size(); ++i) {
+    if (GetElement(i) == &path || GetElement(i)->IsEqual(path))
+      return i;
+  }
+  return 0;
+}
+
+bool VORSelectionSet::AddElement(VORBaseUnknown* pathOrObject) {
+  VORListValVORBaseUnknown_var one;
+  one.Append(VORBaseUnknown_var(pathOrObject));
+  return AddElements(one) > 0;
+}
+
+int VORSelectionSet::AddElements(const VORListValVORBaseUnknown_var& pathsOrObjects) {
+  VORListValVORBaseUnknown_var added;
+  for (const VORBaseUnknown_var& e : pathsOrObjects) {
+    VORPathElement_var path = VORMakePath(e);
+    if (!path || path->GetSize() == 0 || LocateEqual(*path) != 0)
+      continue;
+    _elements.Append(VORBaseUnknown_var(path.get()));
+    added.Append(VORBaseUnknown_var(path.get()));
+  }
+  if (!added.IsEmpty())
+    Notify(added, VORListValVORBaseUnknown_var());
+  return added.Size();
+}
+
+bool VORSelectionSet::RemoveElement(VORBaseUnknown* pathOrObject) {
+  if (pathOrObject == nullptr)
+    return false;
+  VORListValVORBaseUnknown_var removed;
+  auto* path = dynamic_cast<VORPathElement*>(pathOrObject);
+  for (int i = _elements.Size(); i >= 1; --i) {
+    VORPathElement* e = GetElement(i);
+    const bool match =
+        path ? (e == path || e->IsEqual(*path)) : e->GetLeaf() == pathOrObject->GetIdentity();
+    if (match) {
+      removed.InsertAt(1, _elements[i]);
+      _elements.RemovePosition(i);
+    }
+  }
+  if (removed.IsEmpty())
+    return false;
+  Notify(VORListValVORBaseUnknown_var(), removed);
+  return true;
+}
+
+void VORSelectionSet::Empty() {
+  if (_elements.IsEmpty())
+    return;
+  VORListValVORBaseUnknown_var removed;
+  removed.Append(_elements);
+  _elements.RemoveAll();
+  Notify(VORListValVORBaseUnknown_var(), removed);
+}
+
+int VORSelectionSet::Locate(VORBaseUnknown* pathOrObject) const {
+  if (pathOrObject == nullptr)
+    return 0;
+  if (auto* path = dynamic_cast<VORPathElement*>(pathOrObject))
+    return LocateEqual(*path);
+  for (int i = 1; i <= _elements.Size(); ++i) {
+    if (GetElement(i)->GetLeaf() == pathOrObject->GetIdentity())
+      return i;
+  }
+  return 0;
+}
+
+VORListValVORBaseUnknown_var* VORSelectionSet::GetLeaves() const {
+  auto* leaves = new VORListValVORBaseUnknown_var;
+  for (int i = 1; i <= _elements.Size(); ++i)
+    leaves->Append(VORBaseUnknown_var(GetElement(i)->GetLeaf()));
+  return leaves;
+}
+
+VORNotification* VORSelectionSet::CreateChangeNotification(
+    const VORListValVORBaseUnknown_var& added, const VORListValVORBaseUnknown_var& removed) {
+  return new VORSOChangeNotification(this, added, removed);
+}
+
+void VORSelectionSet::Notify(const VORListValVORBaseUnknown_var& added,
+                             const VORListValVORBaseUnknown_var& removed) {
+  VORHandle<VORSelectionSet> keep(this);
+  auto notification = VORHandle<VORNotification>::Adopt(CreateChangeNotification(added, removed));
+  _publisher->Dispatch(notification);
+}
+
+VORNotification* VORCSO::CreateChangeNotification(const VORListValVORBaseUnknown_var& added,
+                                                  const VORListValVORBaseUnknown_var& removed) {
+  return new VORCSOChangeNotification(this, added, removed);
+}
+
+VORISO::VORISO() : _publisher(VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher(this))) {}
+
+VORISO::~VORISO() = default;
+
+bool VORISO::AddElement(VORBaseUnknown* model) {
+  if (model == nullptr || IsPresent(model))
+    return false;
+  _models.Append(VORBaseUnknown_var(model));
+  _publisher->Dispatch("VORISOAdd");
+  return true;
+}
+
+bool VORISO::RemoveElement(VORBaseUnknown* model) {
+  if (model == nullptr || _models.RemoveValue(VORBaseUnknown_var(model)) == 0)
+    return false;
+  _publisher->Dispatch("VORISORemove");
+  return true;
+}
+
+void VORISO::Empty() {
+  if (_models.IsEmpty())
+    return;
+  _models.RemoveAll();
+  _publisher->Dispatch("VORISORemove");
+}
+
+void VORISO::AddViewer(VORBaseUnknown* viewer) {
+  if (viewer != nullptr && std::find(_viewers.begin(), _viewers.end(), viewer) == _viewers.end())
+    _viewers.push_back(viewer);
+}
+
+void VORISO::RemoveViewer(VORBaseUnknown* viewer) {
+  std::erase(_viewers, viewer);
+}
+
+namespace {
+struct Sets {
+  VORCSO_var cso;
+  VORPSO_var pso;
+  VORHSO_var hso;
+  VORISO_var iso;
+};
+Sets& Current() {
+  static Sets sets;
+  return sets;
+}
+}  // namespace
+
+namespace VORSelectionContext {
+void Set(VORCSO* cso, VORPSO* pso, VORHSO* hso, VORISO* iso) {
+  Current() = Sets{VORCSO_var(cso), VORPSO_var(pso), VORHSO_var(hso), VORISO_var(iso)};
+}
+VORCSO* CSO() {
+  return Current().cso.get();
+}
+VORPSO* PSO() {
+  return Current().pso.get();
+}
+VORHSO* HSO() {
+  return Current().hso.get();
+}
+VORISO* ISO() {
+  return Current().iso.get();
+}
+}  // namespace VORSelectionContext

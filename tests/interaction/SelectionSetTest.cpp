@@ -1,0 +1,121 @@
+#include <gtest/gtest.h>
+
+#include <string>
+#include <vector>
+
+#include "InteractionTestObjects.h"
+#include "VORCSO.h"
+#include "VORCommand.h"
+#include "VORISO.h"
+#include "VORPathElement.h"
+
+namespace {
+// "+a +b" / "-a": one entry per notification, leaves named by the test.
+class CSORecorder {
+ public:
+  explicit CSORecorder(VORCSO* cso) : _subscriber(Make<VORCommand>()) {
+    _subscriber->AddCallback(cso->GetEventPublisher(), "VORCSOChangeNotification",
+                             [this](VORBaseUnknown*, VORNotification* n, void*) { Record(n); });
+  }
+  void Name(VORBaseUnknown* object, const std::string& name) { _names.emplace_back(object, name); }
+  std::vector<std::string> log;
+
+ private:
+  std::string NameOf(VORBaseUnknown* path) const {
+    VORBaseUnknown* leaf = static_cast<VORPathElement*>(path)->GetLeaf();
+    for (const auto& [object, name] : _names) {
+      if (object == leaf)
+        return name;
+    }
+    return "?";
+  }
+  void Record(VORNotification* n) {
+    auto* change = dynamic_cast<VORCSOChangeNotification*>(n);
+    ASSERT_NE(change, nullptr);
+    std::string entry;
+    for (const auto& p : change->GetAddedElements())
+      entry += (entry.empty() ? "+" : " +") + NameOf(p);
+    for (const auto& p : change->GetRemovedElements())
+      entry += (entry.empty() ? "-" : " -") + NameOf(p);
+    log.push_back(entry);
+  }
+  VORHandle<VORCommand> _subscriber;
+  std::vector<std::pair<VORBaseUnknown*, std::string>> _names;
+};
+}  // namespace
+
+TEST(PathElementTest, WalksFromTheLeafToTheRootAndFindsTheNearestElementOfAType) {
+  auto level = Make<TestStation>("grouping");
+  auto station = Make<TestStation>("station");
+  auto rep = Make<TestThing>();
+  VORListValVORBaseUnknown_var chain;
+  chain.Append(VORBaseUnknown_var(level.get()));
+  chain.Append(VORBaseUnknown_var(station.get()));
+  chain.Append(VORBaseUnknown_var(rep.get()));
+  auto path = Make<VORPathElement>(chain);
+
+  path->InitToLeafElement();
+  EXPECT_EQ(path->NextFatherElement(), rep.get());
+  EXPECT_EQ(path->NextFatherElement(), station.get());
+  EXPECT_EQ(path->NextFatherElement(), level.get());
+  EXPECT_EQ(path->NextFatherElement(), nullptr);
+
+  ITestStation_var found = path->SearchElement<ITestStation>();
+  EXPECT_TRUE(found == station);
+  auto bare = Make<VORPathElement>(rep.get());
+  EXPECT_FALSE(bare->SearchElement<ITestStation>());
+}
+
+TEST(CSOTest, EveryChangeSendsOneNotificationWithTheAddedAndRemovedPathsInOrder) {
+  auto cso = Make<VORCSO>();
+  CSORecorder recorder(cso);
+  auto a = Make<TestStation>("station");
+  auto b = Make<TestStation>("station");
+  recorder.Name(a.get(), "a");
+  recorder.Name(b.get(), "b");
+
+  EXPECT_TRUE(cso->AddElement(a.get()));
+  EXPECT_FALSE(cso->AddElement(Make<VORPathElement>(a.get()).get()));  // an equal path
+  VORListValVORBaseUnknown_var both;
+  both.Append(VORBaseUnknown_var(b.get()));
+  both.Append(VORBaseUnknown_var(a.get()));
+  EXPECT_EQ(cso->AddElements(both), 1);
+  EXPECT_EQ(cso->Locate(b.get()), 2);
+  EXPECT_TRUE(cso->RemoveElement(a.get()));
+  EXPECT_FALSE(cso->RemoveElement(a.get()));
+  cso->Empty();
+  cso->Empty();  // already empty: silent
+
+  EXPECT_EQ(recorder.log, (std::vector<std::string>{"+a", "+b", "-a", "-b"}));
+  EXPECT_TRUE(cso->IsEmpty());
+}
+
+TEST(CSOTest, IterationAndLeavesFollowTheOrderOfSelection) {
+  auto cso = Make<VORCSO>();
+  auto a = Make<TestThing>();
+  auto b = Make<TestThing>();
+  cso->AddElement(b.get());
+  cso->AddElement(a.get());
+  cso->InitElementList();
+  EXPECT_EQ(cso->NextElement()->GetLeaf(), b.get());
+  EXPECT_EQ(cso->NextElement()->GetLeaf(), a.get());
+  EXPECT_EQ(cso->NextElement(), nullptr);
+  std::unique_ptr<VORListValVORBaseUnknown_var> leaves(cso->GetLeaves());
+  ASSERT_EQ(leaves->Size(), 2);
+  EXPECT_TRUE((*leaves)[1] == b);
+}
+
+TEST(ISOTest, HoldsEachModelOnceAndForgetsViewersOnRequest) {
+  auto iso = Make<VORISO>();
+  auto model = Make<TestThing>();
+  auto viewer = Make<TestThing>();
+  EXPECT_TRUE(iso->AddElement(model.get()));
+  EXPECT_FALSE(iso->AddElement(model.get()));
+  iso->AddViewer(viewer.get());
+  iso->AddViewer(viewer.get());
+  EXPECT_EQ(iso->GetViewers().size(), 1u);
+  iso->RemoveViewer(viewer.get());
+  EXPECT_TRUE(iso->GetViewers().empty());
+  EXPECT_TRUE(iso->RemoveElement(model.get()));
+  EXPECT_FALSE(iso->IsPresent(model.get()));
+}
