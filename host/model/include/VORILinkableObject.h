@@ -12,7 +12,6 @@ class VORILinkableObject : public virtual VORBaseUnknown {
   static constexpr const char* ItemLink = "AssignedItem";          // activity -> item
   static constexpr const char* ResourceLink = "AssignedResource";  // activity -> resource
   static constexpr const char* IOItemLink = "IOItem";              // product IO -> item
-  static constexpr const char* IOProductLink = "IOProduct";        // product IO -> product
   static constexpr const char* ComponentLink = "Component";        // assembly -> product/assembly
   static constexpr const char* ReferenceLink = "Reference";        // product -> reference product
 

@@ -29,7 +29,8 @@ class VORISPPFlowMgt : public virtual VORBaseUnknown {
   // item: a product or a manufacturing assembly of the same document. Emits kind 29.
   virtual HRESULT AddProductInput(VORBaseUnknown* item, VORBaseUnknown_var& productInput) = 0;
   virtual HRESULT AddProductOutput(VORBaseUnknown* item, VORBaseUnknown_var& productOutput) = 0;
-  // Removes an input or output of this activity (and the item assignments made with it).
+  // Removes an input or output of this activity; item assignments made with it stay, without
+  // their input.
   // Emits kind 29.
   virtual HRESULT RemoveProductIO(VORBaseUnknown* productIO) = 0;
 };

@@ -22,6 +22,12 @@ class VORChangeLog {
   int Size() const { return static_cast<int>(_inverses.size()); }
   bool IsEmpty() const { return _inverses.empty(); }
   void Clear() { _inverses.clear(); }
+  // Moves other's inverses after this log's own (a nested step joins its command).
+  void Append(VORChangeLog&& other) {
+    for (auto& f : other._inverses)
+      _inverses.push_back(std::move(f));
+    other._inverses.clear();
+  }
 
  private:
   friend class VORModelDoor;
