@@ -1,0 +1,57 @@
+// A group of reps drawn in order (later children on top) through an optional matrix.
+#pragma once
+
+#include <memory>
+#include <vector>
+
+#include "VOR2DRep.h"
+
+class VOR2DBagRep : public VOR2DRep {
+  VOR_DECLARE_CLASS(VOR2DBagRep, VOR2DRep)
+ public:
+  VOR2DBagRep() = default;
+
+  // Appends child (a reference is taken); a child of another bag is moved here. Null and the
+  // bag itself or one of its fathers are refused (false).
+  bool AddChild(VOR2DRep* child);
+  // Detaches child and drops the bag's reference at once (the caller must hold its own when the
+  // rep is still in use). False when child is not a child of this bag.
+  bool RemoveChild(VOR2DRep* child);
+  // Detaches child and releases it through deferred deletion, so that a rep still on the call
+  // stack (a dragged scroller) survives the current event.
+  bool DestroyChild(VOR2DRep* child);
+  // Removes every child (deferred release, as DestroyChild).
+  void EmptyBag();
+
+  int GetSize() const { return static_cast<int>(_children.size()); }
+  // Child at position 1..GetSize(), null out of range.
+  VOR2DRep* GetChild(int position) const;
+  const std::vector<VOR2DRep_var>& GetChildren() const { return _children; }
+
+  void SetMatrix(const VOR3x3Matrix& matrix);
+  // Null when no matrix was set (the bag draws its children as they are).
+  const VOR3x3Matrix* GetMatrix() const { return _hasMatrix ? &_matrix : nullptr; }
+  void GetMatrix(VOR3x3Matrix& matrix) const { matrix = _matrix; }
+  void ResetMatrix();
+
+  bool HitTest(const VORMathPoint2D& p, double tolerance) const override;
+  void CollectPicks(const VORMathPoint2D& p, double tolerance, std::vector<VOR2DRep*>& chain,
+                    std::vector<VORPickHit>& out) override;
+
+ protected:
+  ~VOR2DBagRep() override;
+  VORBox2D ComputeBoundingBox() const override;
+  void FlattenShown(VORFlattenContext& context) const override;
+
+ private:
+  void Detach(VOR2DRep* child);
+  // Point of the father's frame in the children's frame; false when the matrix is singular.
+  bool ToLocal(const VORMathPoint2D& p, VORMathPoint2D& local, double& scale) const;
+
+  std::vector<VOR2DRep_var> _children;
+  VOR3x3Matrix _matrix;
+  VOR3x3Matrix _inverse;
+  bool _hasMatrix = false;
+  bool _invertible = true;
+};
+VOR_DECLARE_HANDLE(VOR2DBagRep);

@@ -1,0 +1,40 @@
+// A rep drawn from a list of graphic primitives, each with its packed graphic attribute word
+// and alpha (VORGraphicAttribute.h). The rep owns its primitives.
+#pragma once
+
+#include <memory>
+#include <vector>
+
+#include "VOR2DPolylineGP.h"
+#include "VOR2DRep.h"
+#include "VORGraphicAttribute.h"
+
+class VOR2DCustomRep : public VOR2DRep {
+  VOR_DECLARE_CLASS(VOR2DCustomRep, VOR2DRep)
+ public:
+  VOR2DCustomRep() = default;
+
+  // Takes ownership of primitive (null is ignored, false).
+  bool AddPrimitive(VOR2DGP* primitive, const VOR2DGraphicAttribute& attribute);
+  bool AddPrimitive(VOR2DGP* primitive, unsigned int word, int alpha) {
+    return AddPrimitive(primitive, VOR2DGraphicAttribute(word, static_cast<std::uint8_t>(alpha)));
+  }
+  void RemoveAllPrimitives();
+  int GetPrimitiveCount() const { return static_cast<int>(_primitives.size()); }
+  const VOR2DGP* GetPrimitive(int position) const;  // 1-based, null out of range
+  VOR2DGraphicAttribute GetAttribute(int position) const;
+
+  bool HitTest(const VORMathPoint2D& p, double tolerance) const override;
+
+ protected:
+  VORBox2D ComputeBoundingBox() const override;
+  void FlattenShown(VORFlattenContext& context) const override;
+
+ private:
+  struct Entry {
+    std::unique_ptr<VOR2DGP> primitive;
+    VOR2DGraphicAttribute attribute;
+  };
+  std::vector<Entry> _primitives;
+};
+VOR_DECLARE_HANDLE(VOR2DCustomRep);

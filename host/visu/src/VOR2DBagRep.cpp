@@ -1,0 +1,149 @@
+#include "VOR2DBagRep.h"
+
+#include <algorithm>
+
+#include "VORDeferredDeletion.h"
+
+VOR2DBagRep::~VOR2DBagRep() {
+  for (VOR2DRep_var& child : _children)
+    child->_father = nullptr;
+}
+
+bool VOR2DBagRep::AddChild(VOR2DRep* child) {
+  if (child == nullptr)
+    return false;
+  for (VOR2DRep* r = this; r != nullptr; r = r->GetFather()) {
+    if (r == child)
+      return false;
+  }
+  VOR2DRep_var keep(child);
+  if (child->_father != nullptr)
+    child->_father->RemoveChild(child);
+  _children.push_back(keep);
+  child->_father = this;
+  Invalidate();
+  return true;
+}
+
+void VOR2DBagRep::Detach(VOR2DRep* child) {
+  child->_father = nullptr;
+  Invalidate();
+}
+
+bool VOR2DBagRep::RemoveChild(VOR2DRep* child) {
+  // Searched from the end: removal of the last added child is the common case.
+  for (auto it = _children.rbegin(); it != _children.rend(); ++it) {
+    if (it->get() == child) {
+      VOR2DRep_var keep = *it;
+      _children.erase(std::next(it).base());
+      Detach(child);
+      return true;
+    }
+  }
+  return false;
+}
+
+bool VOR2DBagRep::DestroyChild(VOR2DRep* child) {
+  if (child == nullptr)
+    return false;
+  child->AddRef();
+  if (!RemoveChild(child)) {
+    child->Release();
+    return false;
+  }
+  VORCommandDeletion(child);
+  return true;
+}
+
+void VOR2DBagRep::EmptyBag() {
+  std::vector<VOR2DRep_var> children;
+  children.swap(_children);
+  for (VOR2DRep_var& child : children) {
+    child->_father = nullptr;
+    VORCommandDeletion(child.Detach());
+  }
+  Invalidate();
+}
+
+VOR2DRep* VOR2DBagRep::GetChild(int position) const {
+  if (position < 1 || position > GetSize())
+    return nullptr;
+  return _children[static_cast<size_t>(position - 1)].get();
+}
+
+void VOR2DBagRep::SetMatrix(const VOR3x3Matrix& matrix) {
+  _matrix = matrix;
+  _hasMatrix = true;
+  _invertible = matrix.Invert(_inverse);
+  Invalidate();
+}
+
+void VOR2DBagRep::ResetMatrix() {
+  _matrix = VOR3x3Matrix();
+  _inverse = VOR3x3Matrix();
+  _hasMatrix = false;
+  _invertible = true;
+  Invalidate();
+}
+
+VORBox2D VOR2DBagRep::ComputeBoundingBox() const {
+  VORBox2D box;
+  for (const VOR2DRep_var& child : _children) {
+    if (child->IsShown())
+      box.Extend(child->GetBoundingBox());
+  }
+  return _hasMatrix ? _matrix.TransformBox(box) : box;
+}
+
+bool VOR2DBagRep::ToLocal(const VORMathPoint2D& p, VORMathPoint2D& local, double& scale) const {
+  if (!_hasMatrix) {
+    local = p;
+    scale = 1.0;
+    return true;
+  }
+  if (!_invertible)
+    return false;
+  local = _inverse.Transform(p);
+  scale = _matrix.ScaleFactor();
+  return true;
+}
+
+bool VOR2DBagRep::HitTest(const VORMathPoint2D& p, double tolerance) const {
+  VORMathPoint2D local;
+  double scale = 1.0;
+  if (!ToLocal(p, local, scale))
+    return false;
+  const double localTolerance = scale > 0.0 ? tolerance / scale : tolerance;
+  for (auto it = _children.rbegin(); it != _children.rend(); ++it) {
+    const VOR2DRep* child = it->get();
+    if (child->IsShown() && child->GetBoundingBox().Contains(local.x, local.y, localTolerance) &&
+        child->HitTest(local, localTolerance))
+      return true;
+  }
+  return false;
+}
+
+void VOR2DBagRep::CollectPicks(const VORMathPoint2D& p, double tolerance,
+                               std::vector<VOR2DRep*>& chain, std::vector<VORPickHit>& out) {
+  if (!IsShown() || !GetBoundingBox().Contains(p.x, p.y, tolerance))
+    return;
+  VORMathPoint2D local;
+  double scale = 1.0;
+  if (!ToLocal(p, local, scale))
+    return;
+  const double localTolerance = scale > 0.0 ? tolerance / scale : tolerance;
+  chain.push_back(this);
+  // Last drawn is in front.
+  for (auto it = _children.rbegin(); it != _children.rend(); ++it)
+    (*it)->CollectPicks(local, localTolerance, chain, out);
+  chain.pop_back();
+}
+
+void VOR2DBagRep::FlattenShown(VORFlattenContext& context) const {
+  const VOR3x3Matrix saved = context.matrix;
+  if (_hasMatrix)
+    context.matrix = saved * _matrix;
+  for (const VOR2DRep_var& child : _children)
+    child->Flatten(context);
+  context.matrix = saved;
+}

@@ -1,0 +1,170 @@
+#include "VORManipulator.h"
+
+#include <algorithm>
+
+#include "VOR2DBagRep.h"
+#include "VOR2DManipulator.h"
+#include "VOR2DRep.h"
+
+VORManipulator::VORManipulator(VORCommand* father, const VORString& name, int style)
+    : VORCommand(father, name), _style(style) {
+  auto make = [this](const char* event) {
+    return VORHandle<VORManipulatorNotification>::Adopt(
+        new VORManipulatorNotification(this, event));
+  };
+  _preactivate = make(kVORPreactivate);
+  _endPreactivate = make(kVOREndPreactivate);
+  _activate = make(kVORActivate);
+  _manipulate = make(kVORManipulate);
+  _endManipulate = make(kVOREndManipulate);
+}
+
+VORManipulator::~VORManipulator() {
+  for (auto& rep : _reps) {
+    if (rep->_manipulator == this)
+      rep->_manipulator = nullptr;
+  }
+}
+
+void VORManipulator::SetDirection(const VORMathVector2Df& direction) {
+  _direction = direction.Normalized();
+  _hasDirection = _direction.Norm() > 0.0f;
+}
+
+void VORManipulator::AddElement(VOR2DRep* rep) {
+  if (rep == nullptr)
+    return;
+  if (rep->_manipulator != nullptr && rep->_manipulator != this)
+    rep->_manipulator->RemoveElement(rep);
+  if (std::find(_reps.begin(), _reps.end(), VORHandle<VOR2DRep>(rep)) == _reps.end())
+    _reps.emplace_back(rep);
+  rep->_manipulator = this;
+}
+
+bool VORManipulator::RemoveElement(VOR2DRep* rep) {
+  auto it = std::find_if(_reps.begin(), _reps.end(), [rep](auto& r) { return r.get() == rep; });
+  if (it == _reps.end())
+    return false;
+  VORHandle<VOR2DRep> keep = *it;
+  _reps.erase(it);
+  if (rep->_manipulator == this)
+    rep->_manipulator = nullptr;
+  return true;
+}
+
+void VORManipulator::RemoveAllElements() {
+  while (!_reps.empty())
+    RemoveElement(_reps.back().get());
+}
+
+void VORManipulator::SendAny(const char* event, VORNotification* notification) {
+  VORManipulator_var keep(this);
+  GetEventPublisher()->Dispatch(event, notification);
+  if (GetFather() != nullptr)
+    SendNotification(GetFather(), notification);
+}
+
+void VORManipulator::Send(VORManipulatorNotification* notification, const VORMathPoint2D& point,
+                          const VORMathPoint2D& delta, int modifiers) {
+  notification->_point = point;
+  notification->_delta = delta;
+  notification->_modifiers = modifiers;
+  SendAny(notification->GetEventName(), notification);
+}
+
+void VORManipulator::Preactivate(VORViewer* viewer, const VORMathPoint2D& point, int modifiers) {
+  if (_preactivated)
+    return;
+  _preactivated = true;
+  _viewer = viewer;
+  _current = point;
+  Send(_preactivate, point, {}, modifiers);
+}
+
+void VORManipulator::EndPreactivate(VORViewer* viewer, const VORMathPoint2D& point, int modifiers) {
+  if (!_preactivated)
+    return;
+  _preactivated = false;
+  _viewer = viewer;
+  _current = point;
+  Send(_endPreactivate, point, {}, modifiers);
+  if (!_pressed)
+    _viewer = nullptr;
+}
+
+void VORManipulator::PointerPress(VORViewer* viewer, const VORMathPoint2D& point,
+                                  int /*modifiers*/) {
+  _viewer = viewer;
+  _pressed = true;
+  _dragging = false;
+  _current = point;
+}
+
+void VORManipulator::PointerDrag(const VORMathPoint2D& point, int modifiers) {
+  if (!_pressed)
+    return;
+  _dragging = true;
+  double dx = point.x - _current.x;
+  double dy = point.y - _current.y;
+  if (_hasDirection) {
+    const double along = dx * _direction.x + dy * _direction.y;
+    dx = along * _direction.x;
+    dy = along * _direction.y;
+  }
+  _current = point;
+  _position.origin.x += dx;
+  _position.origin.y += dy;
+  ApplyDrag({dx, dy});
+  Send(_manipulate, point, {dx, dy}, modifiers);
+}
+
+bool VORManipulator::PointerRelease(const VORMathPoint2D& point, int modifiers) {
+  if (!_pressed)
+    return false;
+  _pressed = false;
+  const bool wasDragging = _dragging;
+  _dragging = false;
+  _current = point;
+  bool activated = false;
+  if (wasDragging) {
+    Send(_endManipulate, point, {}, modifiers);
+  } else if (_style != 2) {
+    Send(_activate, point, {}, modifiers);
+    activated = true;
+  }
+  if (!_preactivated)
+    _viewer = nullptr;
+  return activated;
+}
+
+void VORManipulator::Context(VORViewer* viewer, VORContext* context) {
+  if (context == nullptr)
+    return;
+  _viewer = viewer;
+  SendAny(kVORContext, context);
+}
+
+void VORManipulator::ApplyDrag(const VORMathPoint2D&) {}
+
+VOR2DManipulator::VOR2DManipulator(VORCommand* father, const VORString& name, VOR2DRep* rep,
+                                   int style, int options)
+    : VORManipulator(father, name, style), _options(options) {
+  AddElement(rep);
+}
+
+void VOR2DManipulator::ApplyDrag(const VORMathPoint2D& delta) {
+  if ((_options & 1) == 0)
+    return;
+  for (const auto& rep : GetElements()) {
+    auto* bag = dynamic_cast<VOR2DBagRep*>(rep.get());
+    if (bag == nullptr)
+      continue;
+    VOR3x3Matrix m;
+    bag->GetMatrix(m);
+    double tx = 0.0;
+    double ty = 0.0;
+    m.GetTranslation(tx, ty);
+    m.SetTranslation(tx + delta.x, ty + delta.y);
+    bag->SetMatrix(m);
+  }
+}
