@@ -1,0 +1,66 @@
+// A document window of the frame: a name, its editor, a displayed title, a rectangle (a change
+// sends the size notification), a frame for its viewer, and DeleteWindow. A new window joins
+// the current layout, which takes the creator's reference; DeleteWindow removes it and releases
+// it through deferred destruction.
+#pragma once
+
+#include <string>
+
+#include "VORCommand.h"
+#include "VORDlgFrame.h"
+
+class VORFrmEditor;
+
+// Sent on the window's publisher after its rectangle changed.
+class VORFrmWindowSizeNotification : public VORNotification {
+  VOR_DECLARE_CLASS(VORFrmWindowSizeNotification, VORNotification)
+};
+
+struct VORRectangle {
+  int x = 0;
+  int y = 0;
+  int width = 0;
+  int height = 0;
+};
+
+class VORFrmWindow : public VORCommand {
+  VOR_DECLARE_CLASS(VORFrmWindow, VORCommand)
+ public:
+  VORFrmWindow(const VORString& name, VORFrmEditor* editor);
+
+  VORFrmEditor* GetEditor() const { return _editor; }
+  // The displayed title (the name until set).
+  VORUnicodeString GetTitle() const { return _title; }
+  void SetTitle(const VORUnicodeString& title) { _title = title; }
+  // (0, 0, 0, 0) until the layout places the window.
+  VORRectangle GetRectangle() const { return _rectangle; }
+  void SetRectangle(const VORRectangle& rectangle);
+  static const char* GetSizeNotification() { return "VORFrmWindowSizeNotification"; }
+
+  // The frame a viewer attaches to (owned by the window).
+  VORDlgFrame* GetViewerFrame() const { return _viewerFrame.get(); }
+  // The 2D viewer shown in the window, if any (held; a VORViewer of the visu layer).
+  VORBaseUnknown* GetViewer() const { return _viewer.get(); }
+  void SetViewer(VORBaseUnknown* viewer) { _viewer = viewer; }
+  virtual bool Has3DViewer() const { return false; }
+
+  // Closes the window: leaves the layout and is released after the current event.
+  virtual void DeleteWindow();
+  bool IsDeleted() const { return _deleted; }
+
+  // Lines a planner checks in a script ("print window"); default: nothing beyond the title.
+  virtual std::string DescribeContents() const { return std::string(); }
+
+ protected:
+  ~VORFrmWindow() override;
+
+ private:
+  VORFrmEditor* _editor;  // not held: an editor outlives its windows
+  VORUnicodeString _title;
+  VORRectangle _rectangle;
+  VORHandle<VORDlgFrame> _viewerFrame;
+  VORBaseUnknown_var _viewer;
+  bool _deleted = false;
+};
+
+VOR_DECLARE_HANDLE(VORFrmWindow);

@@ -1,0 +1,29 @@
+// Runs scripts of user steps through the driver: one step per line, words separated by blanks,
+// "double quotes" around words with blanks, ${NAME} replaced by the environment variable, '#'
+// starts a comment. Each step is echoed ("> step") followed by what happened; a bad step stops
+// the script with "line N: error: reason". The language is described in docs/scripting.md.
+#pragma once
+
+#include <ostream>
+#include <string>
+#include <vector>
+
+class VORDriver;
+
+class VORScript {
+ public:
+  VORScript(VORDriver& driver, std::ostream& out);
+
+  // Runs the text; name is used in messages. Returns true when every line succeeded.
+  bool Run(const std::string& text);
+  bool RunFile(const std::string& path);
+  // Splits a line into words (quotes, ${NAME}); false and a reason for an unclosed quote.
+  static bool Split(const std::string& line, std::vector<std::string>& words, std::string& error);
+
+ private:
+  bool Execute(const std::vector<std::string>& words, std::string& error);
+  void Flush();
+
+  VORDriver& _driver;
+  std::ostream& _out;
+};

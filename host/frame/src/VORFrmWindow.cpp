@@ -1,0 +1,149 @@
+// Windows, the layout and the application frame.
+#include "VORFrmWindow.h"
+
+#include <algorithm>
+#include <filesystem>
+
+#include "VORApplicationFrame.h"
+#include "VORCommandEngine.h"
+#include "VORDeferredDeletion.h"
+#include "VORDocument.h"
+#include "VORFrmLayout.h"
+#include "VORFrmWindowKinds.h"
+
+VORFrmWindow::VORFrmWindow(const VORString& name, VORFrmEditor* editor)
+    : VORCommand(nullptr, name),
+      _editor(editor),
+      _title(name.ToUnicode()),
+      _viewerFrame(VORHandle<VORDlgFrame>::Adopt(new VORDlgFrame(nullptr, "ViewerFrame"))) {
+  VORFrmLayout::GetCurrentLayout()->AddWindow(this);
+}
+
+VORFrmWindow::~VORFrmWindow() = default;
+
+void VORFrmWindow::SetRectangle(const VORRectangle& r) {
+  const VORRectangle old = _rectangle;
+  _rectangle = r;
+  if (old.width != r.width || old.height != r.height || old.x != r.x || old.y != r.y) {
+    auto n = VORHandle<VORFrmWindowSizeNotification>::Adopt(new VORFrmWindowSizeNotification());
+    DispatchNotification(n);
+  }
+}
+
+void VORFrmWindow::DeleteWindow() {
+  if (_deleted)
+    return;
+  _deleted = true;
+  VORFrmLayout::GetCurrentLayout()->RemoveWindow(this);
+}
+
+VORFrmLayout* VORFrmLayout::GetCurrentLayout() {
+  return VORApplicationFrame::GetApplicationFrame()->GetLayout();
+}
+
+VORFrmLayout::~VORFrmLayout() = default;
+
+std::vector<VORFrmWindow*> VORFrmLayout::GetWindowList() const {
+  std::vector<VORFrmWindow*> list;
+  for (const VORFrmWindow_var& w : _windows)
+    list.push_back(w.get());
+  return list;
+}
+
+VORListValVORBaseUnknown_var* VORFrmLayout::GetWindows() const {
+  auto* list = new VORListValVORBaseUnknown_var;
+  for (const VORFrmWindow_var& w : _windows)
+    list->Append(VORBaseUnknown_var(w.get()));
+  return list;
+}
+
+void VORFrmLayout::SetCurrentWindow(VORFrmWindow* window) {
+  if (window != nullptr && std::none_of(_windows.begin(), _windows.end(),
+                                        [window](const auto& w) { return w.get() == window; }))
+    return;
+  _current = window;
+  if (window != nullptr && window->GetEditor() != nullptr)
+    VORFrmEditor::SetCurrentEditor(window->GetEditor());
+}
+
+void VORFrmLayout::TileHorizontally() {
+  if (_windows.empty())
+    return;
+  const int n = static_cast<int>(_windows.size());
+  const int width = _clientArea.width / n;
+  for (int i = 0; i < n; ++i)
+    _windows[static_cast<size_t>(i)]->SetRectangle(
+        VORRectangle{_clientArea.x + i * width, _clientArea.y, width, _clientArea.height});
+  _mdiState = MDITiled;
+}
+
+void VORFrmLayout::AddWindow(VORFrmWindow* window) {
+  _windows.push_back(VORFrmWindow_var::Adopt(window));
+  if (_mdiState == MDIMaximized)
+    window->SetRectangle(_clientArea);
+  SetCurrentWindow(window);
+}
+
+void VORFrmLayout::RemoveWindow(VORFrmWindow* window) {
+  auto it = std::find_if(_windows.begin(), _windows.end(),
+                         [window](const auto& w) { return w.get() == window; });
+  if (it == _windows.end())
+    return;
+  VORCommandDeletion(it->Detach());
+  _windows.erase(it);
+  if (_current == window)
+    SetCurrentWindow(_windows.empty() ? nullptr : _windows.back().get());
+}
+
+VORApplicationFrame::VORApplicationFrame()
+    : _mainWindow(VORHandle<VORFrmMainWindow>::Adopt(new VORFrmMainWindow())),
+      _layout(VORFrmLayout_var::Adopt(new VORFrmLayout())) {}
+
+VORApplicationFrame::~VORApplicationFrame() = default;
+
+VORApplicationFrame* VORApplicationFrame::GetApplicationFrame() {
+  // Never destroyed: windows and editors may still be queued for deletion at exit.
+  static VORApplicationFrame* frame = new VORApplicationFrame();
+  return frame;
+}
+
+VORFrmEditor* VORApplicationFrame::OpenDocument(const std::string& path, std::string& error) {
+  VORProcess_var document = VORProcess_var::Adopt(VORProcess::Load(path, error));
+  if (!document)
+    return nullptr;
+  return OpenDocument(document);
+}
+
+VORFrmEditor* VORApplicationFrame::OpenDocument(VORDocument* document) {
+  if (document == nullptr)
+    return nullptr;
+  _editors.push_back(VORFrmEditor_var::Adopt(new VORFrmEditor(document)));
+  VORFrmEditor* editor = _editors.back().get();
+  VORFrmEditor::SetCurrentEditor(editor);
+  std::string name = std::filesystem::path(document->GetStorageName()).filename().string();
+  if (name.empty())
+    name = "Process";
+  new VORFrmTreeWindow(name, editor);  // the layout holds it
+  return editor;
+}
+
+void VORApplicationFrame::CloseEditor(VORFrmEditor* editor) {
+  VORFrmEditor_var keep(editor);
+  for (VORFrmWindow* w : _layout->GetWindowList()) {
+    if (w->GetEditor() == editor)
+      w->DeleteWindow();
+  }
+  std::erase_if(_editors, [editor](const VORFrmEditor_var& e) { return e.get() == editor; });
+  if (VORFrmEditor::GetCurrentEditor() == editor)
+    VORFrmEditor::SetCurrentEditor(_editors.empty() ? nullptr : _editors.back().get());
+}
+
+void VORApplicationFrame::CloseAll() {
+  VORCommandEngine::CancelCurrent();
+  for (VORFrmWindow* w : _layout->GetWindowList())
+    w->DeleteWindow();
+  VORFrmEditor::SetCurrentEditor(nullptr);
+  _editors.clear();
+  _layout->SetMDIState(VORFrmLayout::MDIMaximized);
+  VORDeferredDeletion::Drain();
+}
