@@ -40,6 +40,8 @@ class Document {
   Document& operator=(Document&&) noexcept;
   xercesc::DOMDocument* get() const;
   explicit operator bool() const { return get() != nullptr; }
+  // Line and column (1-based) where element's start tag begins; false when unknown.
+  bool ElementPosition(const xercesc::DOMElement* element, long& line, long& column) const;
   struct Impl;
 
  private:

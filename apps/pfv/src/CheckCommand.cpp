@@ -1,0 +1,33 @@
+// pfv check <document>: loads a document, runs the invariant checker and prints a summary.
+#include <cstdio>
+
+#include "PfvCommand.h"
+#include "VORModel.h"
+
+namespace {
+int RunCheck(const std::vector<std::string>& args) {
+  if (args.size() != 1) {
+    std::fprintf(stderr, "Usage: pfv check <document.pprx>\n");
+    return 2;
+  }
+  std::string error;
+  VORProcess_var doc = VORProcess_var::Adopt(VORProcess::Load(args[0], error));
+  if (!doc) {
+    std::fprintf(stderr, "pfv check: %s\n", error.c_str());
+    return 1;
+  }
+  std::vector<std::string> problems;
+  if (!VORModelChecker::Check(doc.get(), problems)) {
+    for (const std::string& p : problems)
+      std::fprintf(stderr, "pfv check: %s: %s\n", args[0].c_str(), p.c_str());
+    return 1;
+  }
+  const VORProcessStatistics s = doc->GetStatistics();
+  std::printf("%s: %d activities, %d flows, %d products, %d resources\n", args[0].c_str(),
+              s.activities, s.flows, s.products - s.resources, s.resources);
+  return 0;
+}
+}  // namespace
+
+PFV_COMMAND(check, "check", "<document.pprx>",
+            "load a document, check its consistency and print a one-line summary", RunCheck);

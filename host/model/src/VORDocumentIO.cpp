@@ -1,0 +1,760 @@
+// Reading and writing .pprx documents with the DOM. Loading builds a complete new document or
+// nothing; saving writes through the kernel's atomic file write, keeping a backup.
+#include <xercesc/dom/DOM.hpp>
+#include <xercesc/framework/MemBufFormatTarget.hpp>
+#include <xercesc/util/XMLUni.hpp>
+
+#include <algorithm>
+#include <charconv>
+#include <cstring>
+#include <functional>
+#include <stdexcept>
+#include <unordered_map>
+#include <unordered_set>
+
+#include "VORFileIO.h"
+#include "VORLateTypes.h"
+#include "VORModelObjects.h"
+#include "VORXercesPlatform.h"
+
+using namespace xercesc;
+
+namespace {
+
+constexpr const char* kVersion = "1";
+
+// ---------------------------------------------------------------- text helpers
+
+std::u16string X(const char* s) {
+  return VORXercesPlatform::FromUTF8(s);
+}
+
+std::string FormatDouble(double v) {
+  char buf[64];
+  auto r = std::to_chars(buf, buf + sizeof buf, v);
+  return std::string(buf, r.ptr);
+}
+
+const char* AttributeTypeName(VORAttributeType t) {
+  switch (t) {
+    case VORAttributeLong:
+      return "long";
+    case VORAttributeDouble:
+      return "double";
+    case VORAttributeString:
+      return "string";
+    default:
+      return "";
+  }
+}
+
+// ---------------------------------------------------------------- loading
+
+class LoadError : public std::runtime_error {
+ public:
+  using std::runtime_error::runtime_error;
+};
+
+// Cached UTF-16 names, so that the loop does not transcode the same tag names again.
+struct Names {
+  std::unordered_map<std::string, std::u16string> cache;
+  const XMLCh* operator()(const char* name) {
+    auto it = cache.find(name);
+    if (it == cache.end())
+      it = cache.emplace(name, X(name)).first;
+    return reinterpret_cast<const XMLCh*>(it->second.c_str());
+  }
+};
+
+class Loader {
+ public:
+  Loader(const VORXercesPlatform::Document& dom, std::string name, VORDocumentData& data)
+      : _dom(dom), _name(std::move(name)), _data(data) {}
+
+  void Load() {
+    DOMElement* top = _dom.get()->getDocumentElement();
+    if (Tag(top) != "pprDocument")
+      Fail(top, "the document element is <" + Tag(top) + ">, expected <pprDocument>");
+    const std::string version = Attr(top, "version");
+    if (version != kVersion)
+      Fail(top, "unsupported document version '" + version + "'");
+    _data.environment = Attr(top, "environment");
+    DOMElement *products = nullptr, *assemblies = nullptr, *process = nullptr, *planning = nullptr;
+    for (DOMElement* e = top->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+      const std::string tag = Tag(e);
+      DOMElement** slot = tag == "products"     ? &products
+                          : tag == "assemblies" ? &assemblies
+                          : tag == "process"    ? &process
+                          : tag == "planning"   ? &planning
+                                                : nullptr;
+      if (slot == nullptr)
+        Fail(e, "unexpected element <" + tag + "> in <pprDocument>");
+      if (*slot != nullptr)
+        Fail(e, "a second <" + tag + "> element");
+      *slot = e;
+    }
+    if (process == nullptr)
+      Fail(top, "the document has no <process>");
+    if (planning)
+      LoadPlanTypes(planning);
+    if (products)
+      LoadProducts(products);
+    if (assemblies)
+      LoadAssemblies(assemblies);
+    LoadProcess(process);
+    if (planning)
+      LoadHubRecords(planning);
+  }
+
+ private:
+  [[noreturn]] void Fail(const DOMElement* e, const std::string& message) {
+    long line = 0, column = 0;
+    if (e && _dom.ElementPosition(e, line, column))
+      throw LoadError(_name + ":" + std::to_string(line) + ":" + std::to_string(column) + ": " +
+                      message);
+    throw LoadError(_name + ": " + message);
+  }
+
+  std::string Tag(const DOMElement* e) { return VORXercesPlatform::ToUTF8(e->getTagName()); }
+  std::string Attr(const DOMElement* e, const char* name) {
+    return VORXercesPlatform::ToUTF8(e->getAttribute(_names(name)));
+  }
+  bool Has(const DOMElement* e, const char* name) {
+    return e->getAttributeNode(_names(name)) != nullptr;
+  }
+  std::string Required(const DOMElement* e, const char* name) {
+    if (!Has(e, name))
+      Fail(e, "<" + Tag(e) + "> without the attribute '" + name + "'");
+    return Attr(e, name);
+  }
+  double Double(const DOMElement* e, const char* name, double fallback, const std::string& id) {
+    if (!Has(e, name))
+      return fallback;
+    const std::string text = Attr(e, name);
+    double v = 0;
+    auto r = std::from_chars(text.data(), text.data() + text.size(), v);
+    if (text.empty() || r.ec != std::errc() || r.ptr != text.data() + text.size())
+      Fail(e, "'" + id + "': attribute '" + name + "' is not a number: '" + text + "'");
+    return v;
+  }
+  long Long(const DOMElement* e, const char* name, long fallback, const std::string& id) {
+    if (!Has(e, name))
+      return fallback;
+    return ParseLong(e, Attr(e, name), name, id);
+  }
+  long ParseLong(const DOMElement* e, const std::string& text, const char* name,
+                 const std::string& id) {
+    long v = 0;
+    auto r = std::from_chars(text.data(), text.data() + text.size(), v);
+    if (text.empty() || r.ec != std::errc() || r.ptr != text.data() + text.size())
+      Fail(e, "'" + id + "': attribute '" + name + "' is not an integer: '" + text + "'");
+    return v;
+  }
+
+  std::string NewId(const DOMElement* e) {
+    std::string id = Required(e, "id");
+    if (id.empty())
+      Fail(e, "<" + Tag(e) + "> with an empty id");
+    if (_data.Find(id) != nullptr)
+      Fail(e, "duplicate id '" + id + "'");
+    return id;
+  }
+  void Register(VORModelObject* o, const std::string& id) {
+    o->id = id;
+    o->data = &_data;
+    _data.ids[id] = o;
+  }
+  template <class T>
+  T* Ref(const DOMElement* e, const char* attribute, const char* what) {
+    const std::string id = Required(e, attribute);
+    VORModelObject* o = _data.Find(id);
+    if (o == nullptr)
+      Fail(e, std::string(what) + " '" + id + "' does not exist");
+    T* t = dynamic_cast<T*>(o);
+    if (t == nullptr)
+      Fail(e, "'" + id + "' is not " + what);
+    return t;
+  }
+  VORModelObject* ItemRef(const DOMElement* e, const char* attribute) {
+    const std::string id = Required(e, attribute);
+    VORModelObject* o = _data.Find(id);
+    if (o == nullptr)
+      Fail(e, "item '" + id + "' does not exist");
+    if (!dynamic_cast<VORProductImpl*>(o) && !dynamic_cast<VORMfgAssemblyImpl*>(o))
+      Fail(e, "'" + id + "' is not an item (a product or an assembly)");
+    return o;
+  }
+  static void Link(VORModelObject* s, VORModelObject* t, const std::string& type,
+                   VORProductIOImpl* via = nullptr) {
+    s->out.push_back({t, type, via});
+    t->in.push_back(s);
+  }
+  void ExpectOnly(const DOMElement* e, std::initializer_list<const char*> tags) {
+    for (DOMElement* c = e->getFirstElementChild(); c; c = c->getNextElementSibling()) {
+      const std::string tag = Tag(c);
+      if (std::none_of(tags.begin(), tags.end(), [&](const char* t) { return tag == t; }))
+        Fail(c, "unexpected element <" + tag + "> in <" + Tag(e) + ">");
+    }
+  }
+
+  VORAttributeValue TypedValue(const DOMElement* e, const std::string& owner) {
+    const std::string type = Required(e, "type");
+    const std::string text = Required(e, "value");
+    if (type == "long")
+      return VORAttributeValue::Long(ParseLong(e, text, "value", owner));
+    if (type == "double") {
+      double v = 0;
+      auto r = std::from_chars(text.data(), text.data() + text.size(), v);
+      if (text.empty() || r.ec != std::errc() || r.ptr != text.data() + text.size())
+        Fail(e, "'" + owner + "': value '" + text + "' is not a double");
+      return VORAttributeValue::Double(v);
+    }
+    if (type == "string")
+      return VORAttributeValue::String(VORUnicodeString(text));
+    Fail(e, "'" + owner + "': unknown value type '" + type + "'");
+  }
+
+  // -------- planning
+
+  void LoadPlanTypes(DOMElement* planning) {
+    ExpectOnly(planning, {"planType", "hubRecord"});
+    std::vector<std::pair<DOMElement*, VORPlanTypeImpl*>> types;
+    for (DOMElement* e = planning->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+      if (Tag(e) != "planType")
+        continue;
+      ExpectOnly(e, {"attribute", "relation"});
+      auto t = VORHandle<VORPlanTypeImpl>::Adopt(new VORPlanTypeImpl());
+      Register(t.get(), NewId(e));
+      for (DOMElement* a = e->getFirstElementChild(); a; a = a->getNextElementSibling()) {
+        if (Tag(a) == "attribute")
+          t->attributes[{Attr(a, "key"), Required(a, "name")}] = VORUnicodeString(Attr(a, "value"));
+      }
+      if (t->Name().IsEmpty())
+        Fail(e, "plan type '" + t->id + "' has no name");
+      _data.planTypes.push_back(t);
+      types.push_back({e, t.get()});
+    }
+    for (auto& [e, t] : types) {
+      if (Has(e, "base"))
+        Link(t, Ref<VORPlanTypeImpl>(e, "base", "a plan type"), VORPlanTypeImpl::BaseLink);
+      for (DOMElement* r = e->getFirstElementChild(); r; r = r->getNextElementSibling()) {
+        if (Tag(r) != "relation")
+          continue;
+        const std::string rel = Required(r, "name");
+        if (rel.empty() || rel == VORPlanTypeImpl::BaseLink)
+          Fail(r, "plan type '" + t->id + "': bad relation name '" + rel + "'");
+        Link(t, Ref<VORPlanTypeImpl>(r, "to", "a plan type"), rel);
+      }
+    }
+    for (auto& [e, t] : types) {
+      std::unordered_set<VORPlanTypeImpl*> seen;
+      for (VORPlanTypeImpl* p = t; p != nullptr; p = p->Base()) {
+        if (!seen.insert(p).second)
+          Fail(e, "plan type '" + t->id + "' is its own base");
+      }
+    }
+  }
+
+  void LoadHubRecords(DOMElement* planning) {
+    for (DOMElement* e = planning->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+      if (Tag(e) != "hubRecord")
+        continue;
+      ExpectOnly(e, {"attribute"});
+      const std::string id = Required(e, "object");
+      if (_data.Find(id) == nullptr)
+        Fail(e, "hub record of '" + id + "', which does not exist");
+      if (_data.hubObjects.count(id))
+        Fail(e, "a second hub record of '" + id + "'");
+      auto h = VORHandle<VORHubObjectImpl>::Adopt(new VORHubObjectImpl());
+      h->objectId = id;
+      for (DOMElement* a = e->getFirstElementChild(); a; a = a->getNextElementSibling())
+        h->attributes[Required(a, "name")] = TypedValue(a, id);
+      _data.hubObjects.emplace(id, h);
+    }
+  }
+
+  // -------- products
+
+  void LoadProducts(DOMElement* products) {
+    ExpectOnly(products, {"product"});
+    std::vector<std::pair<DOMElement*, VORProductImpl*>> all;
+    for (DOMElement* e = products->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+      auto p = VORHandle<VORProductImpl>::Adopt(new VORProductImpl());
+      Register(p.get(), NewId(e));
+      p->partNumber = VORUnicodeString(Attr(e, "name"));
+      p->alias = VORUnicodeString(Attr(e, "alias"));
+      p->shown = Long(e, "shown", 1, p->id) != 0;
+      if (Has(e, "resourceClass")) {
+        p->isResource = true;
+        p->resourceClass = VORUnicodeString(Attr(e, "resourceClass"));
+        p->planType = VORUnicodeString(Attr(e, "planType"));
+        if (p->resourceClass.IsEmpty())
+          Fail(e, "resource '" + p->id + "' with an empty resource class");
+      }
+      _keep.push_back(VORHandle<VORModelObject>(p.get()));
+      all.push_back({e, p.get()});
+    }
+    for (auto& [e, p] : all) {
+      if (Has(e, "father")) {
+        p->father = Ref<VORProductImpl>(e, "father", "a product");
+        if (p->father == p)
+          Fail(e, "product '" + p->id + "' is its own father");
+      }
+      if (Has(e, "reference")) {
+        VORProductImpl* r = Ref<VORProductImpl>(e, "reference", "a product");
+        if (r != p)
+          Link(p, r, VORILinkableObject::ReferenceLink);
+      }
+    }
+    // The tree must be a tree: following fathers ends at a root.
+    std::unordered_map<VORProductImpl*, int> state;  // 1 on the current path, 2 done
+    for (auto& [e, p] : all) {
+      std::vector<VORProductImpl*> path;
+      VORProductImpl* q = p;
+      while (q != nullptr && state[q] == 0) {
+        state[q] = 1;
+        path.push_back(q);
+        q = q->father;
+      }
+      if (q != nullptr && state[q] == 1)
+        Fail(e, "the product tree has a cycle through '" + q->id + "'");
+      for (VORProductImpl* r : path)
+        state[r] = 2;
+    }
+    for (auto& [e, p] : all) {
+      if (p->Reference() != p && p->Reference()->Reference() != p->Reference())
+        Fail(e, "product '" + p->id + "' refers to '" + p->Reference()->id +
+                    "', which itself refers to another product");
+      VORHandle<VORProductImpl> h(p);
+      (p->father ? p->father->children : _data.rootProducts).push_back(h);
+    }
+  }
+
+  // -------- assemblies
+
+  void LoadAssemblies(DOMElement* assemblies) {
+    ExpectOnly(assemblies, {"assembly"});
+    std::vector<std::pair<DOMElement*, VORMfgAssemblyImpl*>> all;
+    for (DOMElement* e = assemblies->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+      ExpectOnly(e, {"component"});
+      auto m = VORHandle<VORMfgAssemblyImpl>::Adopt(new VORMfgAssemblyImpl());
+      Register(m.get(), NewId(e));
+      m->name = VORUnicodeString(Attr(e, "name"));
+      _data.assemblies.push_back(m);
+      all.push_back({e, m.get()});
+    }
+    for (auto& [e, m] : all) {
+      for (DOMElement* c = e->getFirstElementChild(); c; c = c->getNextElementSibling()) {
+        VORModelObject* item = ItemRef(c, "ref");
+        if (m->FindLink(item, VORILinkableObject::ComponentLink))
+          Fail(c, "assembly '" + m->id + "' lists '" + item->id + "' twice");
+        Link(m, item, VORILinkableObject::ComponentLink);
+      }
+    }
+    for (auto& [e, m] : all) {
+      // No assembly may contain itself.
+      std::vector<VORModelObject*> stack;
+      for (VORModelObject* t : m->Targets(VORILinkableObject::ComponentLink))
+        stack.push_back(t);
+      std::unordered_set<VORModelObject*> seen;
+      while (!stack.empty()) {
+        VORModelObject* o = stack.back();
+        stack.pop_back();
+        if (o == m)
+          Fail(e, "assembly '" + m->id + "' contains itself");
+        if (!seen.insert(o).second)
+          continue;
+        for (VORModelObject* t : o->Targets(VORILinkableObject::ComponentLink))
+          stack.push_back(t);
+      }
+    }
+  }
+
+  // -------- process
+
+  void LoadProcess(DOMElement* process) {
+    ExpectOnly(process, {"activity"});
+    DOMElement* e = process->getFirstElementChild();
+    if (e == nullptr || e->getNextElementSibling() != nullptr)
+      Fail(process, "<process> must hold exactly one root activity");
+    if (Attr(e, "type") != VORModelLateTypes::Root)
+      Fail(e, "the root activity must be of type 'BIWActivityRoot', not '" + Attr(e, "type") + "'");
+    auto root = VORHandle<VORRootImpl>::Adopt(new VORRootImpl(VORModelLateTypes::Root));
+    _data.root = root;
+    Register(root.get(), NewId(e));
+    LoadNodeBody(e, root.get());
+  }
+
+  VORGraphNodeImpl* MakeNode(DOMElement* e) {
+    const std::string tag = Tag(e);
+    const std::string type = Required(e, "type");
+    VORGraphNodeImpl* node = nullptr;
+    if (tag == "activity") {
+      if (!VORModelLateTypes::IsActivityType(type) || type == VORModelLateTypes::Root)
+        Fail(e, "unknown activity type '" + type + "'");
+      if (type == VORModelLateTypes::Station)
+        node = new VORStationImpl(type);
+      else if (type == VORModelLateTypes::Grouping)
+        node = new VORGroupingImpl(type);
+      else
+        node = new VORActivityImpl(type);
+    } else {
+      if (!VORModelLateTypes::IsControlNodeType(type))
+        Fail(e, "unknown control node type '" + type + "'");
+      node = new VORControlNodeImpl(type);
+    }
+    return node;
+  }
+
+  void LoadNodeBody(DOMElement* e, VORGraphNodeImpl* node) {
+    const std::string& id = node->id;
+    node->label = VORUnicodeString(Attr(e, "label"));
+    if (Has(e, "x") || Has(e, "y")) {
+      node->hasPosition = true;
+      node->x = Double(e, "x", 0, id);
+      node->y = Double(e, "y", 0, id);
+    }
+    node->state = static_cast<int>(Long(e, "state", 0, id));
+    if (node->state < 0 || node->state > 2)
+      Fail(e, "'" + id + "': node state " + std::to_string(node->state) + " is not 0, 1 or 2");
+    node->width = Double(e, "width", 0, id);
+    node->height = Double(e, "height", 0, id);
+    VORActivityImpl* a = node->AsActivity();
+    if (a == nullptr) {
+      if (e->getFirstElementChild() != nullptr)
+        Fail(e->getFirstElementChild(), "control node '" + id + "' cannot hold elements");
+      return;
+    }
+    a->time = Double(e, "time", 0, id);
+    if (Has(e, "cycleTime")) {
+      if (dynamic_cast<VORStationImpl*>(a) == nullptr)
+        Fail(e, "'" + id + "': only stations have a cycle time");
+      a->stationCycleTime = Double(e, "cycleTime", 0, id);
+    }
+    std::vector<DOMElement*> flows;
+    for (DOMElement* c = e->getFirstElementChild(); c; c = c->getNextElementSibling()) {
+      const std::string tag = Tag(c);
+      if (tag == "activity" || tag == "node") {
+        auto child = VORHandle<VORGraphNodeImpl>::Adopt(MakeNode(c));
+        Register(child.get(), NewId(c));
+        child->father = a;
+        a->children.push_back(child);
+        LoadNodeBody(c, child.get());
+      } else if (tag == "input" || tag == "output") {
+        auto io = VORHandle<VORProductIOImpl>::Adopt(new VORProductIOImpl(tag == "input"));
+        Register(io.get(), NewId(c));
+        io->activity = a;
+        Link(io.get(), ItemRef(c, "item"), VORILinkableObject::IOItemLink);
+        a->productIOs.push_back(io);
+      } else if (tag == "item") {
+        VORModelObject* item = ItemRef(c, "ref");
+        if (a->FindLink(item, VORILinkableObject::ItemLink))
+          Fail(c, "'" + id + "': item '" + item->id + "' assigned twice");
+        VORProductIOImpl* via = nullptr;
+        if (Has(c, "via")) {
+          via = Ref<VORProductIOImpl>(c, "via", "a product input");
+          if (via->activity != a || !via->input)
+            Fail(c, "'" + id + "': '" + via->id + "' is not a product input of this activity");
+        }
+        Link(a, item, VORILinkableObject::ItemLink, via);
+      } else if (tag == "resource") {
+        auto* r = Ref<VORProductImpl>(c, "ref", "a resource");
+        if (!r->isResource)
+          Fail(c, "'" + id + "': '" + r->id + "' is a product, not a resource");
+        if (a->FindLink(r, VORILinkableObject::ResourceLink))
+          Fail(c, "'" + id + "': resource '" + r->id + "' assigned twice");
+        Link(a, r, VORILinkableObject::ResourceLink);
+      } else if (tag == "attribute") {
+        const std::string name = Required(c, "name");
+        if (name.empty() || a->attributes.count(name))
+          Fail(c, "'" + id + "': attribute '" + name + "' empty or given twice");
+        a->attributes[name] = TypedValue(c, id);
+      } else if (tag == "flow") {
+        flows.push_back(c);
+      } else {
+        Fail(c, "unexpected element <" + tag + "> in activity '" + id + "'");
+      }
+    }
+    for (DOMElement* f : flows) {
+      const std::string from = Required(f, "from"), to = Required(f, "to");
+      auto* a1 = dynamic_cast<VORGraphNodeImpl*>(_data.Find(from));
+      auto* a2 = dynamic_cast<VORGraphNodeImpl*>(_data.Find(to));
+      if (a1 == nullptr)
+        Fail(f, "flow from '" + from + "', which is no activity of the document");
+      if (a2 == nullptr)
+        Fail(f, "flow to '" + to + "', which is no activity of the document");
+      if (a1->father != a || a2->father != a)
+        Fail(f, "flow '" + from + "' -> '" + to + "' does not join two children of '" + id + "'");
+      if (a1 == a2)
+        Fail(f, "flow from '" + from + "' to itself");
+      for (const VORFlowRef& r : a1->next) {
+        if (r.node == a2)
+          Fail(f, "flow '" + from + "' -> '" + to + "' given twice");
+      }
+      const std::uint64_t stamp = _data.nextFlowStamp++;
+      a1->next.push_back({a2, stamp});
+      a2->previous.push_back({a1, stamp});
+    }
+  }
+
+  const VORXercesPlatform::Document& _dom;
+  std::string _name;
+  VORDocumentData& _data;
+  Names _names;
+  std::vector<VORHandle<VORModelObject>> _keep;  // products until the tree owns them
+};
+
+// ---------------------------------------------------------------- saving
+
+class Writer {
+ public:
+  explicit Writer(DOMDocument* doc) : _doc(doc) {}
+
+  DOMElement* Element(DOMElement* parent, const char* tag) {
+    DOMElement* e = _doc->createElement(_names(tag));
+    parent->appendChild(e);
+    return e;
+  }
+  void Set(DOMElement* e, const char* name, const std::string& value) {
+    e->setAttribute(_names(name), reinterpret_cast<const XMLCh*>(X(value.c_str()).c_str()));
+  }
+  void Set(DOMElement* e, const char* name, const VORUnicodeString& value) {
+    e->setAttribute(_names(name), reinterpret_cast<const XMLCh*>(value.ConvertToUTF16().c_str()));
+  }
+  void SetDouble(DOMElement* e, const char* name, double v) { Set(e, name, FormatDouble(v)); }
+  void SetValue(DOMElement* e, const VORAttributeValue& v) {
+    Set(e, "type", std::string(AttributeTypeName(v.type)));
+    if (v.type == VORAttributeLong)
+      Set(e, "value", std::to_string(v.longValue));
+    else if (v.type == VORAttributeDouble)
+      SetDouble(e, "value", v.doubleValue);
+    else
+      Set(e, "value", v.stringValue);
+  }
+
+  void Node(DOMElement* parent, VORGraphNodeImpl* n) {
+    VORActivityImpl* a = n->AsActivity();
+    DOMElement* e = Element(parent, a ? "activity" : "node");
+    Set(e, "id", n->id);
+    Set(e, "type", n->lateType);
+    Set(e, "label", n->label);
+    if (n->hasPosition) {
+      SetDouble(e, "x", n->x);
+      SetDouble(e, "y", n->y);
+    }
+    if (n->state != 0)
+      Set(e, "state", std::to_string(n->state));
+    if (n->width != 0)
+      SetDouble(e, "width", n->width);
+    if (n->height != 0)
+      SetDouble(e, "height", n->height);
+    if (a == nullptr)
+      return;
+    if (a->time != 0)
+      SetDouble(e, "time", a->time);
+    if (dynamic_cast<VORStationImpl*>(a) != nullptr)
+      SetDouble(e, "cycleTime", a->stationCycleTime);
+    for (auto& io : a->productIOs) {
+      DOMElement* c = Element(e, io->input ? "input" : "output");
+      Set(c, "id", io->id);
+      Set(c, "item", io->Item()->id);
+    }
+    for (const VORModelLink& l : a->out) {
+      const bool item = l.type == VORILinkableObject::ItemLink;
+      DOMElement* c = Element(e, item ? "item" : "resource");
+      Set(c, "ref", l.target->id);
+      if (item && l.via != nullptr)
+        Set(c, "via", l.via->id);
+    }
+    for (auto& [name, value] : a->attributes) {
+      DOMElement* c = Element(e, "attribute");
+      Set(c, "name", name);
+      SetValue(c, value);
+    }
+    std::vector<std::pair<std::uint64_t, std::pair<VORGraphNodeImpl*, VORGraphNodeImpl*>>> flows;
+    for (auto& c : a->children) {
+      Node(e, c.get());
+      for (const VORFlowRef& r : c->next)
+        flows.push_back({r.stamp, {c.get(), r.node}});
+    }
+    std::sort(flows.begin(), flows.end());
+    for (auto& [stamp, f] : flows) {
+      DOMElement* c = Element(e, "flow");
+      Set(c, "from", f.first->id);
+      Set(c, "to", f.second->id);
+    }
+  }
+
+  void Product(DOMElement* parent, VORProductImpl* p) {
+    DOMElement* e = Element(parent, "product");
+    Set(e, "id", p->id);
+    if (p->father)
+      Set(e, "father", p->father->id);
+    Set(e, "name", p->partNumber);
+    if (!p->alias.IsEmpty())
+      Set(e, "alias", p->alias);
+    if (!p->shown)
+      Set(e, "shown", std::string("0"));
+    if (p->Reference() != p)
+      Set(e, "reference", p->Reference()->id);
+    if (p->isResource) {
+      Set(e, "resourceClass", p->resourceClass);
+      if (!p->planType.IsEmpty())
+        Set(e, "planType", p->planType);
+    }
+    for (auto& c : p->children)
+      Product(parent, c.get());
+  }
+
+ private:
+  DOMDocument* _doc;
+  Names _names;
+};
+
+}  // namespace
+
+VORProcess* VORProcess::LoadFromString(const std::string& xml, const std::string& name,
+                                       std::string& error) {
+  VORModelLateTypes::Declare();
+  VORXercesPlatform::Document dom = VORXercesPlatform::ParseMemory(xml, name, error);
+  if (!dom)
+    return nullptr;
+  auto doc = VORHandle<VORProcess>::Adopt(new VORProcess());
+  try {
+    Loader loader(dom, name, *doc->_data);
+    loader.Load();
+  } catch (const LoadError& e) {
+    error = e.what();
+    return nullptr;
+  }
+  std::vector<std::string> problems;
+  if (!VORModelChecker::Check(doc.get(), problems)) {
+    error = name + ": inconsistent document: " + problems.front();
+    return nullptr;
+  }
+  // Ids the loader did not use stay free for new objects.
+  doc->_data->nextIdNumber = static_cast<long>(doc->_data->ids.size()) + 1;
+  doc->_data->modified = false;
+  return doc.Detach();
+}
+
+VORProcess* VORProcess::Load(const std::string& path, std::string& error) {
+  std::string content;
+  if (!VORReadFile(path, content, error, std::size_t{64} << 20))
+    return nullptr;
+  VORProcess* doc = LoadFromString(content, path, error);
+  if (doc != nullptr)
+    doc->SetStorageName(path);
+  return doc;
+}
+
+std::string VORProcess::SaveToString() {
+  std::string error;
+  VORXercesPlatform::Initialize(&error);
+  static const XMLCh ls[] = {chLatin_L, chLatin_S, chNull};
+  DOMImplementation* impl = DOMImplementationRegistry::getDOMImplementation(ls);
+  DOMDocument* doc = impl->createDocument(
+      nullptr, reinterpret_cast<const XMLCh*>(X("pprDocument").c_str()), nullptr);
+  std::string result;
+  try {
+    Writer w(doc);
+    DOMElement* top = doc->getDocumentElement();
+    VORDocumentData& d = *_data;
+    w.Set(top, "version", std::string(kVersion));
+    if (!d.environment.empty())
+      w.Set(top, "environment", d.environment);
+    DOMElement* products = w.Element(top, "products");
+    for (auto& p : d.rootProducts)
+      w.Product(products, p.get());
+    if (!d.assemblies.empty()) {
+      DOMElement* assemblies = w.Element(top, "assemblies");
+      for (auto& m : d.assemblies) {
+        DOMElement* e = w.Element(assemblies, "assembly");
+        w.Set(e, "id", m->id);
+        w.Set(e, "name", m->name);
+        for (VORModelObject* c : m->Targets(VORILinkableObject::ComponentLink))
+          w.Set(w.Element(e, "component"), "ref", c->id);
+      }
+    }
+    DOMElement* process = w.Element(top, "process");
+    if (d.root)
+      w.Node(process, d.root.get());
+    if (!d.planTypes.empty() || !d.hubObjects.empty()) {
+      DOMElement* planning = w.Element(top, "planning");
+      for (auto& t : d.planTypes) {
+        DOMElement* e = w.Element(planning, "planType");
+        w.Set(e, "id", t->id);
+        if (VORPlanTypeImpl* b = t->Base())
+          w.Set(e, "base", b->id);
+        for (auto& [key, value] : t->attributes) {
+          DOMElement* a = w.Element(e, "attribute");
+          if (!key.first.empty())
+            w.Set(a, "key", key.first);
+          w.Set(a, "name", key.second);
+          w.Set(a, "value", value);
+        }
+        for (const VORModelLink& l : t->out) {
+          if (l.type == VORPlanTypeImpl::BaseLink)
+            continue;
+          DOMElement* r = w.Element(e, "relation");
+          w.Set(r, "name", l.type);
+          w.Set(r, "to", l.target->id);
+        }
+      }
+      for (auto& [id, h] : d.hubObjects) {
+        if (h->attributes.empty())
+          continue;
+        DOMElement* e = w.Element(planning, "hubRecord");
+        w.Set(e, "object", id);
+        for (auto& [name, value] : h->attributes) {
+          DOMElement* a = w.Element(e, "attribute");
+          w.Set(a, "name", name);
+          w.SetValue(a, value);
+        }
+      }
+    }
+    DOMLSSerializer* serializer = static_cast<DOMImplementationLS*>(impl)->createLSSerializer();
+    serializer->getDomConfig()->setParameter(XMLUni::fgDOMWRTFormatPrettyPrint, true);
+    DOMLSOutput* output = static_cast<DOMImplementationLS*>(impl)->createLSOutput();
+    MemBufFormatTarget target(1 << 20);
+    output->setByteStream(&target);
+    output->setEncoding(reinterpret_cast<const XMLCh*>(X("UTF-8").c_str()));
+    serializer->write(doc, output);
+    result.assign(reinterpret_cast<const char*>(target.getRawBuffer()), target.getLen());
+    output->release();
+    serializer->release();
+  } catch (...) {
+    doc->release();
+    throw;
+  }
+  doc->release();
+  return result;
+}
+
+bool VORProcess::SaveAs(const std::string& path, std::string& error) {
+  std::string content;
+  try {
+    content = SaveToString();
+  } catch (const std::exception& e) {
+    error = path + ": " + e.what();
+    return false;
+  } catch (const xercesc::DOMException&) {
+    error = path + ": the document could not be written as XML";
+    return false;
+  }
+  const auto slash = path.rfind('/');
+  VORRemoveStrayTemporaryFiles(slash == std::string::npos ? "." : path.substr(0, slash));
+  if (!VORWriteFileAtomically(path, content, error, true))
+    return false;
+  SetStorageName(path);
+  _data->modified = false;
+  return true;
+}
+
+bool VORProcess::Save(std::string& error) {
+  if (GetStorageName().empty()) {
+    error = "the document has no file name yet";
+    return false;
+  }
+  return SaveAs(GetStorageName(), error);
+}

@@ -1,0 +1,191 @@
+// The invariant checker: walks the document once and checks every cross reference both ways.
+#include "VORModelChecker.h"
+
+#include <algorithm>
+#include <unordered_map>
+#include <unordered_set>
+
+#include "VORModelObjects.h"
+
+namespace {
+
+class Checker {
+ public:
+  Checker(VORDocumentData& d, std::vector<std::string>& problems) : _d(d), _problems(problems) {}
+
+  bool Run() {
+    const size_t before = _problems.size();
+    if (!_d.root)
+      Problem("the document has no root process");
+    for (VORModelObject* o : _d.AllObjects()) {
+      if (!_objects.insert(o).second)
+        Problem("object '" + o->id + "' is reachable twice");
+    }
+    CheckIds();
+    if (_d.root)
+      CheckNode(_d.root.get(), nullptr);
+    CheckProducts();
+    for (VORModelObject* o : _objects)
+      CheckLinks(o);
+    CheckAssemblyCycles();
+    for (auto& [id, h] : _d.hubObjects) {
+      if (_d.Find(id) == nullptr)
+        Problem("hub record of '" + id + "', which is not in the document");
+    }
+    return _problems.size() == before;
+  }
+
+ private:
+  void Problem(std::string text) { _problems.push_back(std::move(text)); }
+
+  void CheckIds() {
+    std::unordered_set<std::string> seen;
+    for (VORModelObject* o : _objects) {
+      if (o->id.empty())
+        Problem("an object of type '" + o->lateType + "' has no id");
+      else if (!seen.insert(o->id).second)
+        Problem("id '" + o->id + "' is used twice");
+      if (o->data != &_d)
+        Problem("'" + o->id + "' does not know its document");
+      if (_d.Find(o->id) != o)
+        Problem("'" + o->id + "' is missing from the id index");
+    }
+    if (_d.ids.size() != _objects.size())
+      Problem("the id index holds " + std::to_string(_d.ids.size()) + " entries for " +
+              std::to_string(_objects.size()) + " objects");
+  }
+
+  void CheckNode(VORGraphNodeImpl* n, VORActivityImpl* father) {
+    if (n->father != father)
+      Problem("'" + n->id + "' has a wrong father");
+    auto checkSide = [&](const std::vector<VORFlowRef>& refs, bool forward) {
+      std::unordered_set<VORGraphNodeImpl*> seen;
+      for (const VORFlowRef& r : refs) {
+        const std::string what = "flow between '" + n->id + "' and '" +
+                                 (r.node ? r.node->id : std::string("null")) + "'";
+        if (r.node == nullptr || _objects.count(r.node) == 0) {
+          Problem("dangling " + what);
+          continue;
+        }
+        if (r.node->father != n->father || r.node == n)
+          Problem(what + " does not join two siblings");
+        if (!seen.insert(r.node).second)
+          Problem(what + " is given twice");
+        const auto& other = forward ? r.node->previous : r.node->next;
+        if (std::none_of(other.begin(), other.end(),
+                         [&](const VORFlowRef& x) { return x.node == n && x.stamp == r.stamp; }))
+          Problem(what + " is known at one end only");
+      }
+    };
+    checkSide(n->next, true);
+    checkSide(n->previous, false);
+    VORActivityImpl* a = n->AsActivity();
+    if (a == nullptr)
+      return;
+    for (auto& io : a->productIOs) {
+      if (io->activity != a)
+        Problem("product IO '" + io->id + "' does not know its activity '" + a->id + "'");
+      if (io->Item() == nullptr)
+        Problem("product IO '" + io->id + "' has no item");
+    }
+    for (auto& c : a->children)
+      CheckNode(c.get(), a);
+  }
+
+  void CheckProducts() {
+    for (auto& p : _d.rootProducts) {
+      if (p->father != nullptr)
+        Problem("root product '" + p->id + "' has a father");
+      std::unordered_set<VORProductImpl*> path;
+      CheckProduct(p.get(), path);
+    }
+    for (const char* alias : {VORDocument::RootProductAlias}) {
+      int count = 0;
+      for (auto& p : _d.rootProducts)
+        count += p->alias == VORUnicodeString(alias);
+      if (count > 1)
+        Problem(std::string("more than one root product is aliased '") + alias + "'");
+    }
+  }
+
+  void CheckProduct(VORProductImpl* p, std::unordered_set<VORProductImpl*>& path) {
+    if (!path.insert(p).second) {
+      Problem("the product tree has a cycle through '" + p->id + "'");
+      return;
+    }
+    for (auto& c : p->children) {
+      if (c->father != p)
+        Problem("product '" + c->id + "' has a wrong father");
+      CheckProduct(c.get(), path);
+    }
+    path.erase(p);
+  }
+
+  void CheckLinks(VORModelObject* o) {
+    std::unordered_map<VORModelObject*, int> outCount;
+    for (const VORModelLink& l : o->out) {
+      if (l.target == nullptr || _objects.count(l.target) == 0) {
+        Problem("dangling " + l.type + " link from '" + o->id + "'");
+        continue;
+      }
+      outCount[l.target]++;
+      const std::string what = l.type + " link '" + o->id + "' -> '" + l.target->id + "'";
+      if (l.type == VORILinkableObject::ResourceLink) {
+        auto* r = dynamic_cast<VORProductImpl*>(l.target);
+        if (dynamic_cast<VORActivityImpl*>(o) == nullptr || r == nullptr || !r->isResource)
+          Problem(what + " does not assign a resource to an activity");
+      } else if (l.type == VORILinkableObject::ItemLink) {
+        if (dynamic_cast<VORActivityImpl*>(o) == nullptr ||
+            dynamic_cast<VORISPPItem*>(l.target) == nullptr)
+          Problem(what + " does not assign an item to an activity");
+        if (l.via != nullptr &&
+            (_objects.count(l.via) == 0 || l.via->activity != dynamic_cast<VORActivityImpl*>(o)))
+          Problem(what + " was made with an input that is not the activity's");
+      }
+    }
+    for (auto& [target, count] : outCount) {
+      const long back = std::count(target->in.begin(), target->in.end(), o);
+      if (back != count)
+        Problem("links from '" + o->id + "' to '" + target->id + "' are known at one end only");
+    }
+    for (VORModelObject* s : o->in) {
+      if (s == nullptr || _objects.count(s) == 0)
+        Problem("'" + o->id + "' is pointed at by an object that is not in the document");
+      else if (s->LinkIndex(o, nullptr) < 0)
+        Problem("'" + o->id + "' lists '" + s->id + "' as pointing at it, which it does not");
+    }
+  }
+
+  void CheckAssemblyCycles() {
+    for (auto& m : _d.assemblies) {
+      std::vector<VORModelObject*> stack = m->Targets(VORILinkableObject::ComponentLink);
+      std::unordered_set<VORModelObject*> seen;
+      while (!stack.empty()) {
+        VORModelObject* o = stack.back();
+        stack.pop_back();
+        if (o == m.get()) {
+          Problem("assembly '" + m->id + "' contains itself");
+          break;
+        }
+        if (!seen.insert(o).second)
+          continue;
+        for (VORModelObject* t : o->Targets(VORILinkableObject::ComponentLink))
+          stack.push_back(t);
+      }
+    }
+  }
+
+  VORDocumentData& _d;
+  std::vector<std::string>& _problems;
+  std::unordered_set<VORModelObject*> _objects;
+};
+
+}  // namespace
+
+bool VORModelChecker::Check(VORProcess* document, std::vector<std::string>& problems) {
+  if (document == nullptr) {
+    problems.push_back("no document");
+    return false;
+  }
+  return Checker(document->Data(), problems).Run();
+}
