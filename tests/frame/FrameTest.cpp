@@ -1,0 +1,127 @@
+#include <gtest/gtest.h>
+
+#include <memory>
+
+#include "SampleLine.h"
+#include "VORApplicationFrame.h"
+#include "VORCommandHeader.h"
+#include "VORDeferredDeletion.h"
+#include "VORFrmWindowKinds.h"
+#include "VORIVisProperties.h"
+#include "VORSelectionContext.h"
+
+namespace {
+class FrameTest : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    frame->CloseAll();
+    editor = frame->OpenDocument(document);
+  }
+  void TearDown() override { frame->CloseAll(); }
+  VORBaseUnknown_var Child(const char* label) {
+    VORISPPChildManagement_var root(document->GetRootProcess());
+    VORListValVORBaseUnknown_var* children = nullptr;
+    root->GetChildren(children);
+    std::unique_ptr<VORListValVORBaseUnknown_var> owned(children);
+    for (const auto& c : *children) {
+      if (VORFrmObjectLabel(c) == VORUnicodeString(label))
+        return c;
+    }
+    return VORBaseUnknown_var();
+  }
+
+  VORApplicationFrame* frame = VORApplicationFrame::GetApplicationFrame();
+  VORProcess_var document = MakeSampleLine();
+  VORFrmEditor* editor = nullptr;
+  VORFrmLayout* layout = VORFrmLayout::GetCurrentLayout();
+};
+}  // namespace
+
+TEST_F(FrameTest, OpeningADocumentMakesItsEditorAndTreeWindowCurrent) {
+  ASSERT_NE(editor, nullptr);
+  EXPECT_EQ(VORFrmEditor::GetCurrentEditor(), editor);
+  EXPECT_EQ(VORSelectionContext::CSO(), editor->GetCSO());
+  ASSERT_EQ(layout->GetWindowList().size(), 1u);
+  EXPECT_TRUE(layout->GetCurrentWindow()->IsAKindOf("VORFrmTreeWindow"));
+  EXPECT_EQ(layout->GetCurrentWindow()->GetEditor(), editor);
+}
+
+TEST_F(FrameTest, TheCurrentWindowDecidesTheCurrentEditorAndDeletedWindowsAreReleasedLater) {
+  VORProcess_var other = MakeSampleLine();
+  VORFrmEditor* second = frame->OpenDocument(other);
+  VORFrmWindow* first = layout->GetWindowList()[0];
+  layout->SetCurrentWindow(first);
+  EXPECT_EQ(VORFrmEditor::GetCurrentEditor(), editor);
+
+  VORFrmWindow_var watched(layout->GetWindowList()[1]);
+  EXPECT_EQ(watched->GetEditor(), second);
+  const unsigned long refs = watched->RefCount();
+  watched->DeleteWindow();
+  EXPECT_EQ(layout->GetWindowList().size(), 1u);
+  EXPECT_EQ(watched->RefCount(), refs) << "released only when the queue is drained";
+  VORDeferredDeletion::Drain();
+  EXPECT_EQ(watched->RefCount(), refs - 1);
+}
+
+TEST_F(FrameTest, TilingPlacesWindowsSideBySideAndSendsSizeNotifications) {
+  int sizeNotifications = 0;
+  VORFrmWindow* tree = layout->GetWindowList()[0];
+  auto subscriber = VORCommand_var::Adopt(new VORCommand());
+  subscriber->AddCallback(tree->GetEventPublisher(), VORFrmWindow::GetSizeNotification(),
+                          [&](VORBaseUnknown*, VORNotification*, void*) { ++sizeNotifications; });
+  new VORNewInventorySpaceWnd("Product Space", editor);
+  VORCommandHeader::Find(VORFrmHostCommands::TileWinH)->StartCommand();
+  EXPECT_EQ(layout->GetMDIState(), VORFrmLayout::MDITiled);
+  const VORRectangle a = layout->GetWindowList()[0]->GetRectangle();
+  const VORRectangle b = layout->GetWindowList()[1]->GetRectangle();
+  EXPECT_EQ(a.width, 600);
+  EXPECT_EQ(b.x, 600);
+  EXPECT_EQ(b.height, 800);
+  EXPECT_EQ(sizeNotifications, 1);
+  VORDeferredDeletion::Drain();
+}
+
+TEST_F(FrameTest, ThePertChartCommandShowsTheLevelOfTheSelectedActivityAndPicksNodeBoxes) {
+  editor->GetCSO()->AddElement(document->GetRootProcess());
+  VORCommandHeader::Find(VORFrmHostCommands::PertChart)->StartCommand();
+  auto* chart = dynamic_cast<QELFpaPertChartWindow*>(layout->GetCurrentWindow());
+  ASSERT_NE(chart, nullptr);
+  EXPECT_EQ(chart->GetTitle(), VORUnicodeString("Line - PERT Chart"));
+  EXPECT_EQ(chart->DescribeContents(),
+            "  node \"S1\" at (12.5, 12.5)\n"
+            "  node \"S2\" at (62.5, 12.5)\n"
+            "  node \"S3\" at (112.5, 12.5)\n"
+            "  node \"L1\" at (12.5, 62.5)\n");
+  EXPECT_TRUE(chart->PickNode(70, 16) == Child("S2"));
+  EXPECT_TRUE(chart->PickNode(52.5, 7.5) == Child("S2")) << "the box edge still hits";
+  EXPECT_FALSE(chart->PickNode(37.5, 12.5));
+
+  editor->GetCSO()->Empty();
+  editor->GetCSO()->AddElement(document->GetRootProduct());
+  const size_t before = layout->GetWindowList().size();
+  VORCommandHeader::Find(VORFrmHostCommands::PertChart)->StartCommand();
+  EXPECT_EQ(layout->GetWindowList().size(), before) << "a product has no chart";
+  VORDeferredDeletion::Drain();
+}
+
+TEST_F(FrameTest, TheProductSpaceHidesShowsAndCentresOnTheSelectedProduct) {
+  VORCommandHeader::Find(VORFrmHostCommands::ProductSpace)->StartCommand();
+  auto* space = dynamic_cast<VORNewInventorySpaceWnd*>(layout->GetCurrentWindow());
+  ASSERT_NE(space, nullptr);
+  EXPECT_TRUE(space->Has3DViewer());
+  VORListValVORBaseUnknown_var products = space->GetProducts();
+  ASSERT_GE(products.Size(), 3);
+  VORBaseUnknown_var side = products[2];
+  ASSERT_EQ(VORFrmObjectLabel(side), VORUnicodeString("Side panel"));
+
+  editor->GetCSO()->AddElement(side);
+  VORCommandHeader::Find(VORFrmHostCommands::HideShow)->StartCommand();
+  EXPECT_FALSE(space->IsShown(side));
+  EXPECT_FALSE(VORIVisProperties_var(side)->IsShown()) << "the state lives in the model";
+  VORCommandHeader::Find(VORFrmHostCommands::CenterGraph)->StartCommand();
+  EXPECT_EQ(space->GetCenteredObject(), side.get());
+  VORCommandHeader::Find(VORFrmHostCommands::ReframeOn)->StartCommand();
+  EXPECT_EQ(space->GetCenteredObject(), nullptr);
+  EXPECT_EQ(space->GetReframeCount(), 1);
+  VORDeferredDeletion::Drain();
+}
