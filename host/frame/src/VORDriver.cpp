@@ -71,6 +71,7 @@ VORDriver::VORDriver() {
       "VORCommandEndNotification",
       [this](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
         auto* end = static_cast<VORCommandEndNotification*>(n);
+        CollectNotifications();  // what the command showed comes first
         _events.push_back("command " + end->GetCommand()->GetName().str() +
                           (end->IsCancelled() ? " cancelled" : " ended"));
       });

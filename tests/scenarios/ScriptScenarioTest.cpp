@@ -1,0 +1,54 @@
+// The pick-copy story once more, as a script run by the pfv program.
+#include <gtest/gtest.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <string>
+
+#include "SampleLine.h"
+#include "TempDir.h"
+#include "VORFileIO.h"
+
+namespace {
+std::string RunProgram(const std::string& command, int& status) {
+  std::string output;
+  FILE* pipe = ::popen(command.c_str(), "r");
+  if (pipe == nullptr) {
+    status = -1;
+    return output;
+  }
+  char buffer[4096];
+  for (size_t n; (n = std::fread(buffer, 1, sizeof buffer, pipe)) > 0;)
+    output.append(buffer, n);
+  status = ::pclose(pipe);
+  return output;
+}
+
+void ReplaceAll(std::string& text, const std::string& from, const std::string& to) {
+  for (size_t at = text.find(from); at != std::string::npos; at = text.find(from, at + to.size()))
+    text.replace(at, from.size(), to);
+}
+}  // namespace
+
+TEST(ScriptScenarioTest, ThePickCopyStoryAsAScriptPrintsWhatAPlannerChecks) {
+  TempDir dir;
+  const std::string document = dir.Path() + "/line.pprx";
+  ASSERT_EQ(SaveSampleLine(document), "");
+  ::setenv("SCENARIO_DOC", document.c_str(), 1);
+  ::setenv("SCENARIO_DATA", SCENARIO_DATA, 1);
+  int status = 0;
+  std::string output = RunProgram(
+      std::string(PFV_BINARY) + " script " SCENARIO_DATA "/pick_and_copy.pfvs 2>&1", status);
+  ReplaceAll(output, document, "${SCENARIO_DOC}");
+  ReplaceAll(output, SCENARIO_DATA, "${SCENARIO_DATA}");
+  std::string expected, error;
+  ASSERT_TRUE(VORReadFile(SCENARIO_DATA "/pick_and_copy.expected", expected, error)) << error;
+  EXPECT_EQ(output, expected);
+  EXPECT_EQ(status, 0);
+
+  const std::string bad = dir.Write("bad.pfvs", "open ${SCENARIO_DOC}\nstart NoSuchCommand\n");
+  output = RunProgram(std::string(PFV_BINARY) + " script " + bad + " 2>&1", status);
+  EXPECT_NE(output.find("line 2: error: unknown command \"NoSuchCommand\""), std::string::npos)
+      << output;
+  EXPECT_NE(status, 0);
+}
