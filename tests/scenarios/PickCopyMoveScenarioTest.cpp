@@ -75,8 +75,8 @@ TEST_F(PickCopyMoveScenario, PicksAreFilteredCollectedAndToggledWhileTheDialogIs
   ASSERT_TRUE(driver.TypeText("ScenarioPickDlg", "EditorName", ""));
   EXPECT_FALSE(driver.PressOK()) << "an empty name disables OK";
   ASSERT_TRUE(driver.TypeText("ScenarioPickDlg", "EditorName", "Target station"));
-  EXPECT_EQ(driver.TakeEvents(),
-            (std::vector<std::string>{"command ScenarioPick started", "pick of \"L1\" refused"}));
+  EXPECT_EQ(driver.TakeEvents(), (std::vector<std::string>{"command ScenarioPickCmd started",
+                                                           "pick of \"L1\" refused"}));
 }
 
 TEST_F(PickCopyMoveScenario, TheCSOAnnouncesEveryPickInOrder) {
@@ -109,7 +109,7 @@ TEST_F(PickCopyMoveScenario, OKCopiesTheSourcesIntoTheTargetAndReportsIt) {
   PickTargetAndSources();
   ASSERT_TRUE(driver.PressOK("ScenarioPickDlg")) << driver.LastError();
   EXPECT_EQ(driver.TakeEvents(),
-            (std::vector<std::string>{"command ScenarioPick started", "pick of \"L1\" refused",
+            (std::vector<std::string>{"command ScenarioPickCmd started", "pick of \"L1\" refused",
                                       "notification \"Done\": 2 activities copied into S3",
                                       "command ScenarioPickCmd ended"}));
   EXPECT_EQ(ChildrenOf("Line"), "S1 S2 S3 L1");

@@ -156,7 +156,7 @@ bool VORDriver::StartCommand(const std::string& id) {
   VORCommand_var command = VORCommand_var::Adopt(header->CreateCommand());
   if (!command)
     return Fail("cannot create command \"" + id + "\": " + header->LastError());
-  _events.push_back("command " + id + " started");
+  _events.push_back("command " + command->GetName().str() + " started");
   VORCommandEngine::Start(command);
   return Step(true);
 }
