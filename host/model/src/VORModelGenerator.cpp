@@ -102,7 +102,7 @@ class Builder {
     // About four activities per station (the station, a loading, one to three joinings).
     const int stations = std::max(6, _o.activities / 4);
     const int mainStations = std::max(2, stations / 4);
-    const int branchCount = std::clamp((stations - mainStations) / 8, 2, 60);
+    const int branchCount = std::clamp((stations - mainStations) / 7, 2, 60);
     const int perBranch = std::max(1, (stations - mainStations) / branchCount);
 
     std::vector<VORBaseUnknown_var> branchEnds;
@@ -111,11 +111,18 @@ class Builder {
       const Branch& kind = kBranches[b % 4];
       const std::string code = kind.code + (b < 4 ? std::string() : std::to_string(b / 4 + 1));
       VORBaseUnknown_var previous, assembly;
+      const size_t firstPart = _loadedParts.size();
       for (int s = 0; s < perBranch; ++s) {
         VORBaseUnknown_var station =
             Station(code, kind.name, kind.parts, s, b, assembly, previous, branchCount);
         previous = station;
       }
+      // The sub-line's manufacturing assembly: its parts, handled at its last station.
+      VORBaseUnknown_var ma;
+      _door.CreateMfgAssembly("MA " + kind.name + (b < 4 ? std::string() : " " + code), ma);
+      for (size_t k = firstPart; k < _loadedParts.size(); ++k)
+        _door.AddComponent(ma, _loadedParts[k]);
+      _door.AssignItem(previous, ma);
       branchEnds.push_back(previous);
       branchProducts.push_back(assembly);
       Transport(previous, code);
@@ -187,6 +194,7 @@ class Builder {
                                         ? " " + std::to_string((index * 2 + k) / parts.size() + 1)
                                         : std::string())));
     }
+    _loadedParts.insert(_loadedParts.end(), loaded.begin(), loaded.end());
     _door.SetLabel(loading, "Load " + name);
     _door.SetActivityTime(loading, 8 + _rnd.Below(6));
     _door.SetPertPosition(loading, true, 12.5, 12.5);
@@ -372,6 +380,7 @@ class Builder {
   VORModelDoor& _door;
   VORBaseUnknown_var _root, _products, _resources, _cell, _partsFolder, _assemblyFolder;
   std::vector<VORBaseUnknown_var> _planTypes;
+  std::vector<VORBaseUnknown_var> _loadedParts;
 };
 
 }  // namespace

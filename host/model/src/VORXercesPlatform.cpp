@@ -266,21 +266,19 @@ Document ParseMemory(const std::string& content, const std::string& name, std::s
   } catch (const OutOfMemoryException&) {
     error = name + ": refused, the document needs more than " +
             std::to_string(limits.maxMemoryBytes >> 20) + " MiB to parse";
-    return result;
   } catch (const XMLException& e) {
     error = Where(name, static_cast<long>(e.getSrcLine()), 0) + ": " + ToUTF8(e.getMessage());
-    return result;
   } catch (const DOMException& e) {
     error = name + ": " + ToUTF8(e.getMessage());
-    return result;
   } catch (const VORXercesPanic& e) {
     error = name + ": " + e.what();
-    return result;
   }
   if (impl->filter->tooDeep) {
     error = name + ": elements nested deeper than " + std::to_string(limits.maxDepth);
     return result;
   }
+  if (!error.empty())
+    return result;
   if (impl->errors->failed) {
     error = Where(name, impl->errors->line, impl->errors->column) + ": " + impl->errors->message;
     return result;

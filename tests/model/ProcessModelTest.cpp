@@ -1,0 +1,282 @@
+// The process side of the model, interface by interface: flows and their filters, children,
+// items, resources, product IO and the notifications each change emits.
+#include "ModelTestSupport.h"
+
+using List = VORListValVORBaseUnknown_var;
+
+TEST(FlowTest, ActivityFilterSkipsControlNodesAndEmptyFilterKeepsThem) {
+  SmallLine l;
+  List* list = nullptr;
+  VORISPPFlowMgt_var inner(l.inner);
+  inner->GetPreviousActivities(list, "Activity");
+  EXPECT_EQ(Ids(list), "");
+  inner->GetPreviousActivities(list, "");
+  EXPECT_EQ(Ids(list), IdOf(l.start));
+  inner->GetNextActivities(list, nullptr);
+  EXPECT_EQ(Ids(list), IdOf(l.stop));
+  // Link order is kept on both ends.
+  VORISPPFlowMgt_var(l.s1)->GetNextActivities(list, "Activity");
+  EXPECT_EQ(Ids(list), IdOf(l.s2) + " " + IdOf(l.s3));
+  VORISPPFlowMgt_var(l.s3)->GetPreviousActivities(list, "Activity");
+  EXPECT_EQ(Ids(list), IdOf(l.s2) + " " + IdOf(l.s1));
+  // A late-type filter keeps the kinds of that type.
+  VORISPPFlowMgt_var(l.start)->GetNextActivities(list, "PhysicalActivity");
+  EXPECT_EQ(Ids(list), IdOf(l.inner));
+}
+
+TEST(FlowTest, FlowsJoinDistinctSiblingsOnlyAndRemoveLinkWorksBothWays) {
+  SmallLine l;
+  VORISPPFlowMgt_var s1(l.s1), s3(l.s3);
+  EXPECT_EQ(s1->AddNextActivity(l.load), E_INVALIDARG) << "not a sibling";
+  EXPECT_EQ(s1->AddNextActivity(l.s1), E_INVALIDARG) << "itself";
+  EXPECT_EQ(s1->AddNextActivity(l.s2), S_FALSE) << "exists";
+  EXPECT_EQ(VORSPPLinkServices::AreAllreadyLinked(l.s1, l.s2), 0);
+  EXPECT_EQ(VORSPPLinkServices::AreAllreadyLinked(l.s2, l.s1), 1);
+  EXPECT_EQ(VORSPPLinkServices::AreAllreadyLinked(l.s1, l.load), 0);
+  EXPECT_EQ(VORSPPLinkServices::AreAllreadyLinked(l.start, l.stop), 1);
+
+  // Removing from the target's side removes the flow that points at it.
+  EXPECT_EQ(s3->RemoveLink(l.s1), S_OK);
+  EXPECT_EQ(VORSPPLinkServices::AreAllreadyLinked(l.s1, l.s3), 1);
+  EXPECT_EQ(s3->RemoveLink(l.s1), S_FALSE);
+  List* list = nullptr;
+  s1->GetNextActivities(list, "Activity");
+  EXPECT_EQ(Ids(list), IdOf(l.s2));
+  std::vector<std::string> problems;
+  EXPECT_TRUE(VORModelChecker::Check(l.doc.get(), problems)) << problems.front();
+}
+
+TEST(ChildManagementTest, ChildrenByFilterCreationAndRemovalWithEverythingInside) {
+  SmallLine l;
+  VORISPPChildManagement_var g(l.group);
+  List* list = nullptr;
+  g->GetChildren(list);
+  EXPECT_EQ(Ids(list), IdOf(l.start) + " " + IdOf(l.inner) + " " + IdOf(l.stop));
+  g->GetChildren(list, "Activity");
+  EXPECT_EQ(Ids(list), IdOf(l.inner));
+  g->GetChildren(list, "BIWActivityRoot");
+  EXPECT_EQ(Ids(list), "");
+  EXPECT_EQ(g->GetNumberOfChildren(), 3);
+
+  VORBaseUnknown_var child;
+  EXPECT_EQ(g->CreateChild("BIWActivityRoot", child), E_INVALIDARG);
+  EXPECT_EQ(g->CreateChild("NoSuchType", child), E_INVALIDARG);
+  EXPECT_EQ(g->CreateChild(nullptr, child), E_INVALIDARG);
+  EXPECT_FALSE(child);
+  // Control nodes are graph nodes, not activities.
+  EXPECT_TRUE(VORIGENode_var(l.start));
+  EXPECT_FALSE(VORISPPActivity_var(l.start));
+  EXPECT_EQ(VORISPPFlowMgt_var(l.start)->GetProductInputs(list), E_NOTIMPL);
+
+  // Removing S2 takes its children, its flows, its product IO and its links along.
+  VORISPPChildManagement_var root(l.root);
+  EXPECT_EQ(root->RemoveChild(l.load), E_INVALIDARG) << "not a direct child";
+  EXPECT_EQ(root->RemoveChild(l.s2), S_OK);
+  EXPECT_EQ(l.doc->FindObject(IdOf(l.load)), nullptr);
+  EXPECT_EQ(l.doc->FindObject(IdOf(l.s2In)), nullptr);
+  VORISPPFlowMgt_var(l.s1)->GetNextActivities(list, "Activity");
+  EXPECT_EQ(Ids(list), IdOf(l.s3));
+  VORILinkableObject_var(l.panel)->GetPointingObjects(list);
+  EXPECT_EQ(Ids(list), "") << "neither the input nor the assignment points at the panel";
+  VORILinkableObject_var(l.robot)->GetPointingObjects(list);
+  EXPECT_EQ(Ids(list), "");
+  // The removed object is detached, not dangling.
+  VORBaseUnknown_var father;
+  EXPECT_EQ(VORISPPActivity_var(l.load)->GetFatherActivity(father), S_OK);
+  EXPECT_EQ(VORISpecObject_var(l.s2)->GetDocument(), nullptr);
+  std::vector<std::string> problems;
+  EXPECT_TRUE(VORModelChecker::Check(l.doc.get(), problems)) << problems.front();
+}
+
+TEST(ItemAndResourceTest, AssignmentsEmitTheirKindsWithFatherAndSon) {
+  SmallLine l;
+  ActivityRecorder rec(l.root);
+  VORISPPItemMgt_var items(l.s1);
+  VORISPPResourceManagement_var resources(l.s1);
+  const std::string s1 = IdOf(l.s1);
+
+  EXPECT_EQ(items->AssignItem(l.bracket), S_OK);
+  EXPECT_EQ(items->AssignItem(l.bracket), S_FALSE);
+  EXPECT_EQ(items->AssignItem(l.s2In), E_INVALIDARG) << "a product input is not an item";
+  EXPECT_EQ(items->AssignItem(l.panel, l.s2In), E_INVALIDARG) << "input of another activity";
+  EXPECT_EQ(resources->AssignResource(l.robot), S_OK);
+  EXPECT_EQ(resources->AssignResource(l.panel), E_INVALIDARG) << "a product, not a resource";
+  EXPECT_EQ(resources->UnassignResource(l.robot), S_OK);
+  EXPECT_EQ(resources->UnassignResource(l.robot), S_FALSE);
+  EXPECT_EQ(items->UnassignItem(l.bracket), S_OK);
+  EXPECT_EQ(rec.Take(), (std::vector<std::string>{
+                            "17 " + s1 + " " + IdOf(l.bracket), "15 " + s1 + " " + IdOf(l.robot),
+                            "16 " + s1 + " " + IdOf(l.robot), "18 " + s1 + " " + IdOf(l.bracket)}));
+}
+
+TEST(ItemAndResourceTest, ItemListsFilterByTypeAndModeAndResourcesByClass) {
+  SmallLine l;
+  VORBaseUnknown_var ma;
+  l.doc->GetDoor().CreateMfgAssembly("MA floor", ma);
+  VORISPPItemMgt_var(l.weld)->AssignItem(ma);
+  VORISPPItemMgt_var(l.s2)->AssignItem(l.bracket);
+  List* list = nullptr;
+  VORISPPItemMgt_var s2(l.s2);
+  s2->GetAssignedItems(list, "Item", VORISPPItemMgt::AssignedHere);
+  EXPECT_EQ(Ids(list), IdOf(l.panel) + " " + IdOf(l.bracket));
+  s2->GetAssignedItems(list, "Item", VORISPPItemMgt::FirstAssigned);
+  EXPECT_EQ(Ids(list), IdOf(l.panel) + " " + IdOf(l.bracket));
+  s2->GetAssignedItems(list, "Item", VORISPPItemMgt::AssignedHereAndBelow);
+  EXPECT_EQ(Ids(list), IdOf(l.panel) + " " + IdOf(l.bracket) + " " + IdOf(ma));
+  s2->GetAssignedItems(list, "QELMfgAssy", VORISPPItemMgt::AssignedHereAndBelow);
+  EXPECT_EQ(Ids(list), IdOf(ma));
+  VORBaseUnknown_var via;
+  EXPECT_EQ(s2->GetAssignmentInput(l.panel, via), S_OK);
+  EXPECT_EQ(via, l.s2In);
+  EXPECT_EQ(s2->GetAssignmentInput(l.bracket, via), S_FALSE);
+
+  VORISPPResourceManagement_var weld(l.weld);
+  weld->AssignResource(l.gun);
+  weld->GetResources(list, "Resource");
+  EXPECT_EQ(Ids(list), IdOf(l.robot) + " " + IdOf(l.gun));
+  weld->GetResources(list, "WeldGun");
+  EXPECT_EQ(Ids(list), IdOf(l.gun));
+  // Resources answer VORISPPItem (their display name) like every item.
+  EXPECT_EQ(Utf8(VORISPPItem_var(l.gun)->GetDisplayName()), "Gun1");
+}
+
+TEST(ProductIOTest, InputsOutputsAndTheirItemsWithKinds29And39) {
+  SmallLine l;
+  ActivityRecorder rec(l.root);
+  VORISPPFlowMgt_var s2(l.s2);
+  VORISPPProductIO_var in(l.s2In), out(l.s2Out);
+  ASSERT_TRUE(in && out);
+  EXPECT_TRUE(in->IsInput());
+  EXPECT_FALSE(out->IsInput());
+  EXPECT_EQ(VORISpecObject_var(l.s2In)->GetId().str().substr(0, 2), "IO");
+  VORUnicodeString type;
+  VORISpecObject_var(l.s2Out)->GetTypeName(type);
+  EXPECT_EQ(Utf8(type), "ProductOutput");
+  VORBaseUnknown_var item, activity;
+  EXPECT_EQ(in->GetConsumedItem(item), S_OK);
+  EXPECT_EQ(item, l.panel);
+  EXPECT_EQ(in->GetProducedItem(item), S_FALSE);
+  EXPECT_FALSE(item);
+  EXPECT_EQ(out->GetProducedItem(item), S_OK);
+  EXPECT_EQ(item, l.floor);
+  in->GetActivity(activity);
+  EXPECT_EQ(activity, l.s2);
+
+  // An output whose item changes is kind 39, an input's kind 29.
+  EXPECT_EQ(out->SetItem(l.bracket), S_OK);
+  EXPECT_EQ(in->SetItem(l.bracket), S_OK);
+  EXPECT_EQ(out->SetItem(l.s2), E_INVALIDARG);
+  VORBaseUnknown_var added;
+  EXPECT_EQ(s2->AddProductInput(l.floor, added), S_OK);
+  EXPECT_EQ(s2->RemoveProductIO(added), S_OK);
+  EXPECT_EQ(VORISPPFlowMgt_var(l.s1)->RemoveProductIO(l.s2In), E_INVALIDARG);
+  const std::string s = IdOf(l.s2);
+  EXPECT_EQ(rec.Take(), (std::vector<std::string>{
+                            "39 " + s + " " + IdOf(l.s2Out), "29 " + s + " " + IdOf(l.s2In),
+                            "29 " + s + " " + IdOf(added), "29 " + s + " " + IdOf(added)}));
+
+  // Removing an input keeps the assignment made with it, without the input.
+  EXPECT_EQ(s2->RemoveProductIO(l.s2In), S_OK);
+  EXPECT_TRUE(VORISPPItemMgt_var(l.s2)->IsItemAssigned(l.panel));
+  EXPECT_EQ(VORISPPItemMgt_var(l.s2)->GetAssignmentInput(l.panel, item), S_FALSE);
+  std::vector<std::string> problems;
+  EXPECT_TRUE(VORModelChecker::Check(l.doc.get(), problems)) << problems.front();
+}
+
+TEST(ActivityNotificationTest, ChildCreationIsKind3AndRemovalIs3Then8OnTheRemovedActivity) {
+  SmallLine l;
+  ActivityRecorder rec(l.root);
+  // Subscribers of one activity's own dispatcher hear about that activity only.
+  int onS2 = 0;
+  VORIModelEvents_var(l.s2)->GetEventPublisher()->AddCallback(
+      VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(),
+      [&](VORBaseUnknown*, const std::string&, VORNotification*, void*, VORCallbackId) { ++onS2; });
+  VORBaseUnknown_var child;
+  VORISPPChildManagement_var(l.s2)->CreateChild("BIWActivityStudWelding", child);
+  VORISPPChildManagement_var(l.root)->RemoveChild(l.s3);
+  EXPECT_EQ(rec.Take(), (std::vector<std::string>{"3 " + IdOf(l.s2) + " " + IdOf(child),
+                                                  "3 " + IdOf(l.root) + " " + IdOf(l.s3),
+                                                  "8 " + IdOf(l.s3) + " " + IdOf(l.s3)}));
+  EXPECT_EQ(onS2, 1);
+  // Attribute changes are VORModify on the object itself, never activity notifications.
+  std::vector<std::string> what;
+  VORIModelEvents_var(l.s1)->GetEventPublisher()->AddCallback(
+      "VORModify", [&](VORBaseUnknown*, const std::string&, VORNotification* n, void*,
+                       VORCallbackId) { what.push_back(static_cast<VORModify*>(n)->GetWhat()); });
+  VORISPPAbstractActivity_var(l.s1)->SetLabel("S1 renamed");
+  VORIGraphNodeLayout_var(l.s1)->SetPertPosition(37.5, 12.5);
+  VORIGraphNodeLayout_var(l.s1)->SetPertNodeState(2);
+  QELIBIWActivityStation_var(l.s1)->SetStationCycleTime(55);
+  EXPECT_EQ(what, (std::vector<std::string>{"label", "position", "state", "cycletime"}));
+  EXPECT_TRUE(rec.Take().empty());
+  EXPECT_TRUE(l.doc->IsModified());
+}
+
+TEST(ActivityTest, TypesTimesAndTheRootInterfaces) {
+  SmallLine l;
+  VORISPPActivity_var s1(l.s1);
+  EXPECT_EQ(s1->GetActivityType().str(), "BIWActivityStation");
+  EXPECT_EQ(std::string(VORBaseUnknown_var(l.s1)->GetLateType()), "BIWActivityStation");
+  EXPECT_TRUE(QELIBIWActivityStation_var(l.s1));
+  EXPECT_TRUE(QELIBIWItemInfo_var(l.s1));
+  EXPECT_TRUE(QELIBIWItemInfo_var(l.group));
+  EXPECT_FALSE(QELIBIWActivityStation_var(l.group));
+  EXPECT_FALSE(QELIBIWItemInfo_var(l.load));
+  EXPECT_FALSE(VORISPPActivityRoot_var(l.s1));
+  VORBaseUnknown_var root, father;
+  s1->GetRootActivity(root);
+  EXPECT_EQ(root, l.root);
+  EXPECT_EQ(VORISPPActivity_var(l.root)->GetFatherActivity(father), S_FALSE);
+  EXPECT_EQ(VORISPPActivityRoot_var(l.root)->GetProcessDocument(), l.doc.get());
+  QELIUpdateManufAssly_var update(l.root);
+  ASSERT_TRUE(update);
+  update->SetUpdateInProgress(true);
+  EXPECT_TRUE(update->IsUpdateInProgress());
+  VORIGENode_var node(l.weld);
+  node->GetParentNode(father);
+  EXPECT_EQ(father, l.s2);
+
+  VORIUserAttributes_var attrs(l.s1);
+  VORAttributeValue v;
+  EXPECT_EQ(attrs->GetAttributeValue("Shift", v), S_FALSE);
+  EXPECT_EQ(v.type, VORAttributeNone);
+  attrs->SetAttributeValue("Shift", VORAttributeValue::Long(2));
+  attrs->SetAttributeValue("Rate", VORAttributeValue::Double(0.5));
+  attrs->GetAttributeValue("Shift", v);
+  EXPECT_EQ(v.type, 3);
+  EXPECT_EQ(v.longValue, 2);
+  attrs->GetAttributeValue("Rate", v);
+  EXPECT_EQ(v.type, 6);
+  attrs->SetAttributeValue("Rate", VORAttributeValue{});
+  EXPECT_EQ(attrs->GetAttributeValue("Rate", v), S_FALSE);
+}
+
+TEST(BIWItemInfoTest, FirstListIsOwnOutputsSecondIsChildOutputsNotConsumedInside) {
+  SmallLine l;
+  VORBaseUnknown_var weldOut, loadIn, loadOut, sub;
+  VORIProduct_var(l.doc->GetRootProduct())->AddChild("Sub assy", sub);
+  VORISPPFlowMgt_var(l.weld)->AddProductOutput(l.floor, weldOut);
+  VORISPPFlowMgt_var(l.load)->AddProductOutput(sub, loadOut);
+  VORISPPFlowMgt_var(l.weld)->AddProductInput(sub, loadIn);  // the sub assy is used inside
+  QELIBIWItemInfo_var info(l.s2);
+  List* list = nullptr;
+  info->GetFirstItemList(list);
+  EXPECT_EQ(Ids(list), IdOf(l.s2Out));
+  info->GetSecondItemList(list);
+  EXPECT_EQ(Ids(list), IdOf(weldOut));
+  info->GetActivityList(list);
+  EXPECT_EQ(Ids(list), IdOf(l.load) + " " + IdOf(l.weld));
+  info->GetConsumedItems(list);
+  EXPECT_EQ(Ids(list), IdOf(l.panel) + " " + IdOf(sub));
+  EXPECT_TRUE(info->IsListedOutput(weldOut));
+  EXPECT_FALSE(info->IsListedOutput(loadOut));
+  EXPECT_TRUE(info->AcceptsOutputTransfer(l.s2Out, l.s3));
+  EXPECT_FALSE(info->AcceptsOutputTransfer(l.s2Out, l.weld)) << "welds do not take outputs";
+  EXPECT_FALSE(info->AcceptsOutputTransfer(l.s2Out, l.s2));
+  EXPECT_TRUE(info->IsInHierarchyOf(l.root));
+  EXPECT_TRUE(info->IsInHierarchyOf(l.weld));
+  EXPECT_FALSE(info->IsInHierarchyOf(l.s3));
+  // A station without children lists itself.
+  QELIBIWItemInfo_var(l.s1)->GetActivityList(list);
+  EXPECT_EQ(Ids(list), IdOf(l.s1));
+}
