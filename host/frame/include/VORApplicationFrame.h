@@ -24,6 +24,8 @@ class VORApplicationFrame : public VORBaseUnknown {
 
   VORFrmMainWindow* GetMainWindow() const { return _mainWindow.get(); }
   VORFrmLayout* GetLayout() const { return _layout.get(); }
+  // Frame-wide events: VORFrmPickNotification after each pick.
+  VOREventPublisher* GetEventPublisher() const { return _publisher.get(); }
 
   // Loads a process document into a new editor with its tree window, and makes it current.
   // Null and the reason in error when the file cannot be loaded (nothing changes then).
@@ -44,4 +46,5 @@ class VORApplicationFrame : public VORBaseUnknown {
   VORHandle<VORFrmMainWindow> _mainWindow;
   VORFrmLayout_var _layout;
   std::vector<VORFrmEditor_var> _editors;
+  VORHandle<VOREventPublisher> _publisher;
 };

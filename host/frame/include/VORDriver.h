@@ -36,8 +36,9 @@ class VORDriver {
 
   // A pick in the tree: the object by id (or by label), with the objects above it.
   bool PickObject(const std::string& idOrLabel);
-  // A pick in a chart window (by title or name, empty: the current window), in model
-  // coordinates.
+  // A click in a window (by title or name, empty: the current window) at a model point: through
+  // the window's viewer when it has one, else on the chart window's node boxes. A click on the
+  // background empties the selection (without a command) and is reported as an event.
   bool PickInChart(const std::string& window, double x, double y);
   // The object's path (root first), or null when unknown.
   VORPathElement_var PathOf(const std::string& idOrLabel);
@@ -57,7 +58,8 @@ class VORDriver {
   // by name or title.
   bool OpenContextMenu(const std::string& window, double x, double y);
   bool ChooseMenuItem(const std::string& item);
-  // Drags a chart node from one point to another (a manipulator drag).
+  // A drag from one model point to another: a manipulator drag in the window's viewer, or the
+  // chart node under the first point moved by the difference.
   bool Drag(const std::string& window, double x0, double y0, double x1, double y1);
 
   // Windows.
@@ -89,5 +91,6 @@ class VORDriver {
   std::vector<std::string> _events;
   size_t _notificationsSeen = 0;
   unsigned int _engineCallback = 0;
+  unsigned int _pickCallback = 0;
   VORHandle<VORDlgControl> _menu;
 };

@@ -8,8 +8,10 @@
 
 #include "VORCommand.h"
 #include "VORDlgFrame.h"
+#include "VORViewer.h"
 
 class VORFrmEditor;
+class VORViewer;
 
 // Sent on the window's publisher after its rectangle changed.
 class VORFrmWindowSizeNotification : public VORNotification {
@@ -39,17 +41,22 @@ class VORFrmWindow : public VORCommand {
 
   // The frame a viewer attaches to (owned by the window).
   VORDlgFrame* GetViewerFrame() const { return _viewerFrame.get(); }
-  // The 2D viewer shown in the window, if any (held; a VORViewer of the visu layer).
-  VORBaseUnknown* GetViewer() const { return _viewer.get(); }
-  void SetViewer(VORBaseUnknown* viewer) { _viewer = viewer; }
+  // The 2D viewer shown in the window: the one set, else the first viewer created in the viewer
+  // frame; null when none. The window routes the viewer's selection clicks (VORViewerPick) to
+  // the running command or to the editor's CSO, like the driver's picks.
+  VORViewer* GetViewer();
+  void SetViewer(VORViewer* viewer);
   virtual bool Has3DViewer() const { return false; }
 
   // Closes the window: leaves the layout and is released after the current event.
   virtual void DeleteWindow();
   bool IsDeleted() const { return _deleted; }
 
-  // Lines a planner checks in a script ("print window"); default: nothing beyond the title.
-  virtual std::string DescribeContents() const { return std::string(); }
+  // The activity whose children the window shows as a chart, or null (not a chart window).
+  virtual VORBaseUnknown_var GetChartRoot() const { return VORBaseUnknown_var(); }
+  // Lines a planner checks in a script ("print window"): by default the chart's nodes with
+  // their positions when the window shows a chart, else nothing.
+  virtual std::string DescribeContents() const;
 
  protected:
   ~VORFrmWindow() override;
@@ -59,7 +66,8 @@ class VORFrmWindow : public VORCommand {
   VORUnicodeString _title;
   VORRectangle _rectangle;
   VORHandle<VORDlgFrame> _viewerFrame;
-  VORBaseUnknown_var _viewer;
+  VORHandle<VORViewer> _viewer;
+  VORCallbackId _pickCallback = 0;
   bool _deleted = false;
 };
 

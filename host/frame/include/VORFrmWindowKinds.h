@@ -27,6 +27,9 @@ struct VORChartNode {
   bool positioned = false;
 };
 
+// The child graph nodes of root read afresh from the document, in child order.
+std::vector<VORChartNode> VORFrmChartNodes(VORBaseUnknown* root);
+
 // The classic PERT chart: the child graph nodes of one activity at their stored positions.
 class QELFpaPertChartWindow : public VORFrmWindow {
   VOR_DECLARE_CLASS(QELFpaPertChartWindow, VORFrmWindow)
@@ -37,11 +40,9 @@ class QELFpaPertChartWindow : public VORFrmWindow {
 
   QELFpaPertChartWindow(const VORString& name, VORFrmEditor* editor, VORBaseUnknown* root);
   VORBaseUnknown_var GetRootNode() const { return _root; }
-  // The chart's nodes read afresh from the document, in child order.
-  std::vector<VORChartNode> GetNodes() const;
+  VORBaseUnknown_var GetChartRoot() const override { return _root; }
   // The topmost (last) positioned node whose box holds (x, y); null when none.
   VORBaseUnknown_var PickNode(double x, double y) const;
-  std::string DescribeContents() const override;
 
  private:
   VORBaseUnknown_var _root;

@@ -9,6 +9,7 @@
 #include "VORDlgCombo.h"
 #include "VORDlgContextualMenu.h"
 #include "VORDlgEditor.h"
+#include "VORFrmPick.h"
 #include "VORFrmWindowKinds.h"
 #include "VORIGENode.h"
 #include "VORIGraphNodeLayout.h"
@@ -67,6 +68,17 @@ std::string Format(double v) {
 VORDriver::VORDriver() {
   Frame()->CloseAll();
   _notificationsSeen = VORDlgNotify::Recorder().Records().size();
+  _pickCallback = Frame()->GetEventPublisher()->AddCallback(
+      "VORFrmPickNotification",
+      [this](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
+        auto* pick = static_cast<VORFrmPickNotification*>(n);
+        if (pick->GetResult() == VORFrmPickNotification::RefusedByCommand)
+          _events.push_back("pick of \"" +
+                            VORFrmObjectLabel(pick->GetPath()->GetLeaf()).ConvertToUTF8() +
+                            "\" refused");
+        else if (pick->GetResult() == VORFrmPickNotification::Background)
+          _events.push_back("click on the background");
+      });
   _engineCallback = VORCommandEngine::GetEventPublisher()->AddCallback(
       "VORCommandEndNotification",
       [this](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
@@ -81,6 +93,7 @@ VORDriver::~VORDriver() {
   _menu = NULL_var;
   Frame()->CloseAll();
   VORCommandEngine::GetEventPublisher()->RemoveCallback(_engineCallback);
+  Frame()->GetEventPublisher()->RemoveCallback(_pickCallback);
   VORDeferredDeletion::Drain();
 }
 
@@ -192,18 +205,7 @@ VORPathElement_var VORDriver::PathOf(const std::string& idOrLabel) {
 }
 
 bool VORDriver::OfferPick(VORPathElement* path) {
-  if (VORCommandEngine::OfferPath(path))
-    return Step(true);
-  if (dynamic_cast<VORStateCommand*>(VORCommandEngine::Current()) != nullptr) {
-    _events.push_back("pick of \"" + VORFrmObjectLabel(path->GetLeaf()).ConvertToUTF8() +
-                      "\" refused");
-    return Step(true);
-  }
-  // No command waits for a pick: a plain selection.
-  if (VORFrmEditor* editor = GetEditor()) {
-    editor->GetCSO()->Empty();
-    editor->GetCSO()->AddElement(path);
-  }
+  VORFrmDispatchPick(GetEditor(), {VORPathElement_var(path)});
   return Step(true);
 }
 
@@ -216,13 +218,24 @@ bool VORDriver::PickObject(const std::string& idOrLabel) {
 
 bool VORDriver::PickInChart(const std::string& window, double x, double y) {
   VORFrmWindow* w = FindWindow(window);
+  if (w == nullptr)
+    return Fail("no window \"" + window + "\"");
+  if (VORViewer* viewer = w->GetViewer()) {
+    const VORMathPoint2D p = viewer->GetMain2DViewpoint()->ModelToPixel(x, y);
+    viewer->OnMouseMove(p.x, p.y);
+    viewer->OnMousePress(p.x, p.y, VORMouseLeft);
+    viewer->OnMouseRelease(p.x, p.y, VORMouseLeft);
+    return Step(true);
+  }
   auto* chart = dynamic_cast<QELFpaPertChartWindow*>(w);
   if (chart == nullptr)
-    return Fail("no chart window \"" + window + "\"");
+    return Fail("\"" + w->GetTitle().ConvertToUTF8() + "\" shows no chart");
   VORBaseUnknown_var node = chart->PickNode(x, y);
-  if (!node)
-    return Fail("no node at (" + Format(x) + ", " + Format(y) + ")");
-  return OfferPick(PathWithFathers(node));
+  std::vector<VORPathElement_var> paths;
+  if (node)
+    paths.push_back(PathWithFathers(node));
+  VORFrmDispatchPick(w->GetEditor(), paths);
+  return Step(true);
 }
 
 VORDlgDialog* VORDriver::FindDialog(const std::string& name) const {
@@ -303,15 +316,23 @@ bool VORDriver::OpenContextMenu(const std::string& window, double x, double y) {
   if (w == nullptr)
     return Fail("no window \"" + window + "\"");
   _menu = NULL_var;
-  auto context = VORHandle<VORContext>::Adopt(new VORContext(w, x, y));
-  w->DispatchNotification(context);
-  if (w->GetViewer() != nullptr) {
-    if (auto* viewer = dynamic_cast<VORCommand*>(w->GetViewer()))
-      viewer->DispatchNotification(context);
+  VORHandle<VORContext> context;
+  if (VORViewer* viewer = w->GetViewer()) {
+    auto catcher = VORCommand_var::Adopt(new VORCommand());
+    catcher->AddCallback(viewer->GetEventPublisher(), "VORContext",
+                         [&context](VORBaseUnknown*, VORNotification* n, void*) {
+                           context = dynamic_cast<VORContext*>(n);
+                         });
+    const VORMathPoint2D p = viewer->GetMain2DViewpoint()->ModelToPixel(x, y);
+    viewer->OnMouseMove(p.x, p.y);
+    viewer->OnContextMenu(p.x, p.y);
+  } else {
+    context = VORHandle<VORContext>::Adopt(new VORContext(w, x, y));
+    w->DispatchNotification(context);
   }
-  auto* menu = dynamic_cast<VORDlgControl*>(context->GetContextualMenu());
+  auto* menu = context ? dynamic_cast<VORDlgControl*>(context->GetContextualMenu()) : nullptr;
   if (menu == nullptr || menu->GetControls().empty())
-    return Fail("no context menu in \"" + window + "\"");
+    return Fail("no context menu at (" + Format(x) + ", " + Format(y) + ")");
   _menu = menu;
   return Step(true);
 }
@@ -333,12 +354,29 @@ bool VORDriver::ChooseMenuItem(const std::string& item) {
 }
 
 bool VORDriver::Drag(const std::string& window, double x0, double y0, double x1, double y1) {
-  auto* chart = dynamic_cast<QELFpaPertChartWindow*>(FindWindow(window));
+  VORFrmWindow* w = FindWindow(window);
+  if (w == nullptr)
+    return Fail("no window \"" + window + "\"");
+  if (VORViewer* viewer = w->GetViewer()) {
+    const VORMathPoint2D from = viewer->GetMain2DViewpoint()->ModelToPixel(x0, y0);
+    const VORMathPoint2D to = viewer->GetMain2DViewpoint()->ModelToPixel(x1, y1);
+    if (viewer->ManipulatorAt(from.x, from.y) == nullptr)
+      return Fail("nothing to drag at (" + Format(x0) + ", " + Format(y0) + ")");
+    viewer->OnMouseMove(from.x, from.y);
+    viewer->OnMousePress(from.x, from.y, VORMouseLeft);
+    constexpr int kSteps = 4;  // a few intermediate moves, as a hand would make
+    for (int i = 1; i <= kSteps; ++i)
+      viewer->OnMouseMove(from.x + (to.x - from.x) * i / kSteps,
+                          from.y + (to.y - from.y) * i / kSteps);
+    viewer->OnMouseRelease(to.x, to.y, VORMouseLeft);
+    return Step(true);
+  }
+  auto* chart = dynamic_cast<QELFpaPertChartWindow*>(w);
   if (chart == nullptr)
-    return Fail("no chart window \"" + window + "\"");
+    return Fail("\"" + w->GetTitle().ConvertToUTF8() + "\" shows no chart");
   VORIGraphNodeLayout_var layout(chart->PickNode(x0, y0));
   if (!layout)
-    return Fail("no node at (" + Format(x0) + ", " + Format(y0) + ")");
+    return Fail("nothing to drag at (" + Format(x0) + ", " + Format(y0) + ")");
   double x = 0, y = 0;
   layout->GetPertPosition(x, y);
   layout->SetPertPosition(x + (x1 - x0), y + (y1 - y0));

@@ -9,6 +9,7 @@
 #include "VORDeferredDeletion.h"
 #include "VORDocument.h"
 #include "VORFrmLayout.h"
+#include "VORFrmPick.h"
 #include "VORFrmWindowKinds.h"
 
 VORFrmWindow::VORFrmWindow(const VORString& name, VORFrmEditor* editor)
@@ -20,6 +21,37 @@ VORFrmWindow::VORFrmWindow(const VORString& name, VORFrmEditor* editor)
 }
 
 VORFrmWindow::~VORFrmWindow() = default;
+
+VORViewer* VORFrmWindow::GetViewer() {
+  if (!_viewer) {
+    for (VORCommand* child : _viewerFrame->GetChildren()) {
+      if (auto* viewer = dynamic_cast<VORViewer*>(child)) {
+        SetViewer(viewer);
+        break;
+      }
+    }
+  }
+  return _viewer.get();
+}
+
+void VORFrmWindow::SetViewer(VORViewer* viewer) {
+  if (_viewer.get() == viewer)
+    return;
+  if (_viewer)
+    RemoveCallback(_pickCallback);
+  _pickCallback = 0;
+  _viewer = viewer;
+  if (!viewer)
+    return;
+  _pickCallback = AddCallback(
+      viewer->GetEventPublisher(), VORViewer::kPickEvent,
+      [this](VORBaseUnknown*, VORNotification* n, void*) {
+        auto* pick = dynamic_cast<VORViewerPickNotification*>(n);
+        if (pick != nullptr)
+          VORFrmDispatchPick(_editor, pick->GetPaths(), pick->GetModifiers(),
+                             pick->GetMultiSelBehavior());
+      });
+}
 
 void VORFrmWindow::SetRectangle(const VORRectangle& r) {
   const VORRectangle old = _rectangle;
@@ -34,6 +66,7 @@ void VORFrmWindow::DeleteWindow() {
   if (_deleted)
     return;
   _deleted = true;
+  SetViewer(nullptr);
   VORFrmLayout::GetCurrentLayout()->RemoveWindow(this);
 }
 
@@ -97,7 +130,8 @@ void VORFrmLayout::RemoveWindow(VORFrmWindow* window) {
 
 VORApplicationFrame::VORApplicationFrame()
     : _mainWindow(VORHandle<VORFrmMainWindow>::Adopt(new VORFrmMainWindow())),
-      _layout(VORFrmLayout_var::Adopt(new VORFrmLayout())) {}
+      _layout(VORFrmLayout_var::Adopt(new VORFrmLayout())),
+      _publisher(VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher(this))) {}
 
 VORApplicationFrame::~VORApplicationFrame() = default;
 

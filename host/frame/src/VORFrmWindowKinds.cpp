@@ -61,9 +61,9 @@ QELFpaPertChartWindow::QELFpaPertChartWindow(const VORString& name, VORFrmEditor
                                              VORBaseUnknown* root)
     : VORFrmWindow(name, editor), _root(root) {}
 
-std::vector<VORChartNode> QELFpaPertChartWindow::GetNodes() const {
+std::vector<VORChartNode> VORFrmChartNodes(VORBaseUnknown* rootObject) {
   std::vector<VORChartNode> nodes;
-  VORIGENode_var root(_root);
+  VORIGENode_var root{VORBaseUnknown_var(rootObject)};
   VORListValVORBaseUnknown_var* children = nullptr;
   if (!root || FAILED(root->GetChildren(children)) || children == nullptr)
     return nodes;
@@ -72,8 +72,8 @@ std::vector<VORChartNode> QELFpaPertChartWindow::GetNodes() const {
     VORChartNode node;
     node.object = child;
     node.label = VORFrmObjectLabel(child);
-    node.width = DefaultNodeWidth;
-    node.height = DefaultNodeHeight;
+    node.width = QELFpaPertChartWindow::DefaultNodeWidth;
+    node.height = QELFpaPertChartWindow::DefaultNodeHeight;
     if (VORIGraphNodeLayout_var layout(child); layout) {
       node.positioned = layout->HasPertPosition();
       layout->GetPertPosition(node.x, node.y);
@@ -90,7 +90,7 @@ std::vector<VORChartNode> QELFpaPertChartWindow::GetNodes() const {
 }
 
 VORBaseUnknown_var QELFpaPertChartWindow::PickNode(double x, double y) const {
-  const std::vector<VORChartNode> nodes = GetNodes();
+  const std::vector<VORChartNode> nodes = VORFrmChartNodes(_root);
   for (auto it = nodes.rbegin(); it != nodes.rend(); ++it) {
     if (it->positioned && std::fabs(x - it->x) <= it->width / 2 &&
         std::fabs(y - it->y) <= it->height / 2)
@@ -99,9 +99,9 @@ VORBaseUnknown_var QELFpaPertChartWindow::PickNode(double x, double y) const {
   return VORBaseUnknown_var();
 }
 
-std::string QELFpaPertChartWindow::DescribeContents() const {
+std::string VORFrmWindow::DescribeContents() const {
   std::string text;
-  for (const VORChartNode& node : GetNodes()) {
+  for (const VORChartNode& node : VORFrmChartNodes(GetChartRoot())) {
     text += "  node \"" + node.label.ConvertToUTF8() + "\"";
     text += node.positioned ? " at (" + Format(node.x) + ", " + Format(node.y) + ")" : " unplaced";
     text += "\n";
