@@ -88,11 +88,15 @@ class VORManipulator : public VORCommand {
   const VORMathPoint2D& GetCurrentPoint() const { return _current; }
   bool IsPreactivated() const { return _preactivated; }
   bool IsDragging() const { return _dragging; }
+  // The rep among its elements that the current (or last) gesture started on.
+  VOR2DRep* GetPressedElement() const { return _pressed_element.get(); }
 
   // Entry points of the viewer.
   void Preactivate(VORViewer* viewer, const VORMathPoint2D& point, int modifiers);
   void EndPreactivate(VORViewer* viewer, const VORMathPoint2D& point, int modifiers);
-  void PointerPress(VORViewer* viewer, const VORMathPoint2D& point, int modifiers);
+  // element: the manipulated rep the press hit (null when unknown).
+  void PointerPress(VORViewer* viewer, const VORMathPoint2D& point, int modifiers,
+                    VOR2DRep* element = nullptr);
   // A drag step (the viewer calls it once the pointer moved past the drag threshold).
   void PointerDrag(const VORMathPoint2D& point, int modifiers);
   // Returns true when the release activated the manipulator (a click).
@@ -120,6 +124,7 @@ class VORManipulator : public VORCommand {
   VORHandle<VORManipulatorNotification> _manipulate;
   VORHandle<VORManipulatorNotification> _endManipulate;
   VORViewer* _viewer = nullptr;
+  VORHandle<VOR2DRep> _pressed_element;
   VORMathPoint2D _current;
   bool _preactivated = false;
   bool _pressed = false;

@@ -136,7 +136,8 @@ class VORViewer : public VORCommand {
   void OnMouseLeave();
 
   // The manipulator of the frontmost rep under the pixel, or null.
-  VORManipulator* ManipulatorAt(double px, double py);
+  // element (when given) receives the rep the manipulator acts on.
+  VORManipulator* ManipulatorAt(double px, double py, VOR2DRep** element = nullptr);
   // Model point under the pointer's last known position.
   const VORMathPoint2D& GetPointerModelPoint() const { return _pointer; }
 

@@ -34,27 +34,34 @@ void VORManipulator::SetDirection(const VORMathVector2Df& direction) {
 void VORManipulator::AddElement(VOR2DRep* rep) {
   if (rep == nullptr)
     return;
-  if (rep->_manipulator != nullptr && rep->_manipulator != this)
+  // The rep's back pointer tells membership: no search through the elements.
+  if (rep->_manipulator == this)
+    return;
+  if (rep->_manipulator != nullptr)
     rep->_manipulator->RemoveElement(rep);
-  if (std::find(_reps.begin(), _reps.end(), VORHandle<VOR2DRep>(rep)) == _reps.end())
-    _reps.emplace_back(rep);
+  _reps.emplace_back(rep);
   rep->_manipulator = this;
 }
 
 bool VORManipulator::RemoveElement(VOR2DRep* rep) {
-  auto it = std::find_if(_reps.begin(), _reps.end(), [rep](auto& r) { return r.get() == rep; });
-  if (it == _reps.end())
+  // From the end: the last added rep is the usual one to go.
+  auto rit = std::find_if(_reps.rbegin(), _reps.rend(), [rep](auto& r) { return r.get() == rep; });
+  if (rit == _reps.rend())
     return false;
-  VORHandle<VOR2DRep> keep = *it;
-  _reps.erase(it);
+  VORHandle<VOR2DRep> keep = *rit;
+  _reps.erase(std::next(rit).base());
   if (rep->_manipulator == this)
     rep->_manipulator = nullptr;
   return true;
 }
 
 void VORManipulator::RemoveAllElements() {
-  while (!_reps.empty())
-    RemoveElement(_reps.back().get());
+  std::vector<VORHandle<VOR2DRep>> reps;
+  reps.swap(_reps);
+  for (auto& rep : reps) {
+    if (rep->_manipulator == this)
+      rep->_manipulator = nullptr;
+  }
 }
 
 void VORManipulator::SendAny(const char* event, VORNotification* notification) {
@@ -92,9 +99,10 @@ void VORManipulator::EndPreactivate(VORViewer* viewer, const VORMathPoint2D& poi
     _viewer = nullptr;
 }
 
-void VORManipulator::PointerPress(VORViewer* viewer, const VORMathPoint2D& point,
-                                  int /*modifiers*/) {
+void VORManipulator::PointerPress(VORViewer* viewer, const VORMathPoint2D& point, int /*modifiers*/,
+                                  VOR2DRep* element) {
   _viewer = viewer;
+  _pressed_element = element;
   _pressed = true;
   _dragging = false;
   _current = point;

@@ -273,7 +273,7 @@ VORListValVORBaseUnknown_var* VORViewer::Pick(double px, double py) {
   return list;
 }
 
-VORManipulator* VORViewer::ManipulatorAt(double px, double py) {
+VORManipulator* VORViewer::ManipulatorAt(double px, double py, VOR2DRep** element) {
   const VORMathPoint2D p = _viewpoint->PixelToModel(px, py);
   const std::vector<VORPickHit> hits =
       PickReps(p.x, p.y, kPickTolerancePixels / _viewpoint->GetScale());
@@ -282,8 +282,11 @@ VORManipulator* VORViewer::ManipulatorAt(double px, double py) {
   // The frontmost rep decides; its nearest manipulated ancestor owns the gesture.
   const std::vector<VOR2DRep*>& reps = hits.front().reps;
   for (auto it = reps.rbegin(); it != reps.rend(); ++it) {
-    if ((*it)->GetManipulator() != nullptr)
+    if ((*it)->GetManipulator() != nullptr) {
+      if (element != nullptr)
+        *element = *it;
       return (*it)->GetManipulator();
+    }
   }
   return nullptr;
 }
@@ -329,9 +332,10 @@ void VORViewer::OnMousePress(double px, double py, int button, int modifiers) {
   _moved = false;
   if (button != VORMouseLeft)
     return;
-  _active = ManipulatorAt(px, py);
+  VOR2DRep* element = nullptr;
+  _active = ManipulatorAt(px, py, &element);
   if (_active)
-    _active->PointerPress(this, _pointer, modifiers);
+    _active->PointerPress(this, _pointer, modifiers, element);
 }
 
 void VORViewer::OnMouseMove(double px, double py, int modifiers) {

@@ -1,0 +1,127 @@
+// Draws one level of the process tree into a viewer: one node box with its label per child
+// graph node of the window root, orthogonal arrows for the precedence flows between sibling
+// boxes, and the inner charts of expanded super nodes inside their enlarged boxes. Every node
+// it adds is announced with a QELPertAppInfoNotify (remove flag 0) on the root's model events,
+// every node taken out of the chart with remove flag 1; dragging a box moves the node and
+// dispatches QELPertPositionNotify there (during the drag and, snapped, at its end).
+#pragma once
+
+#include <memory>
+#include <unordered_map>
+#include <vector>
+
+#include "QELPertParameters.h"
+#include "VOR2DBagRep.h"
+#include "VOR2DCustomRep.h"
+#include "VOR2DManipulator.h"
+#include "VORCommand.h"
+#include "VORViewer.h"
+
+class VORFrmWindow;
+
+class QELPertController : public VORCommand {
+  VOR_DECLARE_CLASS(QELPertController, VORCommand)
+ public:
+  // window: the frame window that shows the chart (not held, may be null). viewer: not held,
+  // must outlive the controller. editable: nodes can be dragged (with ViewerMode 1). extra is
+  // accepted for the module's calls.
+  QELPertController(VORFrmWindow* window, const VORBaseUnknown_var& root, VORViewer* viewer,
+                    ViewerName name, ViewerMode mode, bool editable, VORBaseUnknown_var extra);
+
+  VORViewer* GetViewer() const { return _viewer.get(); }
+  VORFrmWindow* GetWindow() const { return _window; }
+  VORBaseUnknown_var GetWindowRootNode() const { return _root; }
+  // A new root: the chart must be empty (RemoveAllPertNodes) or it is emptied first.
+  void SetWindowRootNode(VORBaseUnknown* root, VORBaseUnknown_var extra);
+
+  // Adds the node box of a child graph node of the root (with the inner chart when the node is
+  // an expanded super node) and its links to the boxes already there. S_FALSE when the node is
+  // already drawn, E_INVALIDARG when it is no graph node.
+  HRESULT AddChildNode(VORBaseUnknown_var& node);
+  // Takes one node (and its inner chart) out of the chart.
+  HRESULT RemoveChildNode(VORBaseUnknown_var& node);
+  // Moves the node's box to its current position (QELIPertNodeExt) and redraws its links;
+  // redraw asks the viewer to repaint.
+  HRESULT RefreshNodePositionInPert(VORBaseUnknown_var& node, bool redraw);
+  void RemoveAllPertNodes();
+  // Drops the node manipulator's subscriptions (before the controller is destroyed).
+  void RemoveNodeManipCmdCB();
+  // Rebuilds every link of the chart from the flows in the model.
+  void RefreshLinks();
+
+  // Super nodes (used by QELPertNodeTraverser).
+  HRESULT ShowInnerNodes(VORBaseUnknown* superNode);
+  HRESULT HideInnerNodes(VORBaseUnknown* superNode);
+  // Rebuilds the node's box for its current state (enlarged when expanded).
+  HRESULT UpdateNodeShape(VORBaseUnknown* node);
+
+  // Inspection.
+  bool IsInChart(VORBaseUnknown* node) const;
+  VOR2DBagRep* GetNodeRep(VORBaseUnknown* node) const;
+  int GetNodeCount() const { return static_cast<int>(_nodes.size()); }
+  int GetLinkCount() const;
+  VOR2DBagRep* GetChartRep() const { return _chart; }
+  VORManipulator* GetNodeManipulator() const { return _manipulator; }
+
+ protected:
+  ~QELPertController() override;
+
+ private:
+  struct Level;
+  struct Link;
+  struct Node {
+    VORBaseUnknown_var object;
+    VOR2DBagRep_var bag;
+    Level* level = nullptr;        // the level the node is drawn in
+    std::unique_ptr<Level> inner;  // set while the inner chart is shown
+    std::vector<Link*> links;
+    double x = 0.0;  // chart position
+    double y = 0.0;
+    double w = 0.0;
+    double h = 0.0;
+  };
+  struct Level {
+    VORBaseUnknown* owner = nullptr;  // root or super node (not held)
+    Node* ownerNode = nullptr;        // null for the root level
+    VOR2DBagRep_var links;
+    VOR2DBagRep_var nodes;
+    std::vector<Node*> members;
+    std::vector<std::unique_ptr<Link>> linkList;
+  };
+  struct Link {
+    Node* from = nullptr;
+    Node* to = nullptr;
+    VOR2DCustomRep_var rep;
+  };
+
+  Node* Find(VORBaseUnknown* node) const;
+  Node* AddNode(VORBaseUnknown* object, Level* level);
+  void RemoveNode(Node* node, bool announce);
+  void AddLinksOf(Node* node);
+  void UpdateLink(Link* link);
+  void BuildShape(Node* node);
+  void PlaceNode(Node* node);
+  void PlaceInnerNodes(Node* node);
+  void ReadPosition(Node* node);
+  void ShiftInner(Node* node, double dx, double dy);
+  void ResizeOwners(Node* node);
+  void Announce(VORBaseUnknown* node, int removeRep);
+  void DispatchPosition(Node* node);
+  void OnManipulate(VORNotification* notification);
+  void OnEndManipulate(VORNotification* notification);
+  Node* DraggedNode() const;
+  void ClearChart();
+
+  VORFrmWindow* _window;
+  VORViewer_var _viewer;  // held: the chart rep must be taken out of it at the end
+  VORBaseUnknown_var _root;
+  ViewerName _name;
+  ViewerMode _mode;
+  bool _editable;
+  VOR2DBagRep_var _chart;
+  std::unique_ptr<Level> _top;
+  std::unordered_map<VORBaseUnknown*, std::unique_ptr<Node>> _nodes;
+  VOR2DManipulator_var _manipulator;
+  double _dragStartX = 0.0;
+  double _dragStartY = 0.0;
+};

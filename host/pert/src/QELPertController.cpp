@@ -1,0 +1,615 @@
+#include "QELPertController.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "QELIPertNode.h"
+#include "QELIPertPosition.h"
+#include "QELPertClientVisuServices.h"
+#include "QELPertNodeData.h"
+#include "QELPertNotifications.h"
+#include "QELPertViewer.h"
+#include "VOR2DPolygonRep.h"
+#include "VOR2DTextRep.h"
+#include "VORIGENode.h"
+#include "VORIModelEvents.h"
+#include "VORISPPFlowMgt.h"
+#include "VORTextMetric.h"
+
+namespace {
+
+VORBaseUnknown* Key(VORBaseUnknown* object) {
+  return object ? object->GetIdentity() : nullptr;
+}
+
+VORUnicodeString LabelOf(VORBaseUnknown* object) {
+  VORIGENode_var node(object);
+  VORUnicodeString label;
+  if (node)
+    node->GetLabel(label);
+  return label;
+}
+
+std::vector<VORMathPoint2Df> BoxPoints(double w, double h) {
+  const auto hw = static_cast<float>(w * 0.5);
+  const auto hh = static_cast<float>(h * 0.5);
+  return {{-hw, -hh}, {hw, -hh}, {hw, hh}, {-hw, hh}};
+}
+
+// Arrow head at q pointing along x, barbs of length 2 at 18 degrees from the shaft.
+VOR2DPolylineGP* ArrowHead(const VORMathPoint2Df& p, const VORMathPoint2Df& q) {
+  const float d = q.x >= p.x ? 1.0f : -1.0f;
+  const double angle = 2.82744;
+  const auto ax = static_cast<float>(d * std::cos(angle));
+  const auto ay = static_cast<float>(d * std::sin(angle));
+  const auto bx = static_cast<float>(d * std::cos(-angle));
+  const auto by = static_cast<float>(d * std::sin(-angle));
+  const VORMathPoint2Df points[3] = {
+      {q.x + 2.0f * bx, q.y + 2.0f * by}, q, {q.x + 2.0f * ax, q.y + 2.0f * ay}};
+  return new VOR2DPolylineGP(points, 3, 1);
+}
+
+}  // namespace
+
+QELPertController::QELPertController(VORFrmWindow* window, const VORBaseUnknown_var& root,
+                                     VORViewer* viewer, ViewerName name, ViewerMode mode,
+                                     bool editable, VORBaseUnknown_var)
+    : VORCommand(nullptr, "QELPertController"),
+      _window(window),
+      _viewer(viewer),
+      _name(name),
+      _mode(mode),
+      _editable(editable) {
+  _chart = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  _chart->SetTag("PertChart");
+  _top = std::make_unique<Level>();
+  _top->links = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  _top->nodes = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  _chart->AddChild(_top->links);
+  _chart->AddChild(_top->nodes);
+  if (_viewer) {
+    _viewer->AddRep(_chart);
+    if (auto* pertViewer = dynamic_cast<QELPertViewer*>(_viewer.get()))
+      pertViewer->SetController(this);
+  }
+  if (_editable && _mode == PertModeEditable) {
+    _manipulator =
+        VOR2DManipulator_var::Adopt(new VOR2DManipulator(this, "PertNodeManip", nullptr, 1, 0));
+    AddCallback(_manipulator->GetEventPublisher(), VORManipulator::kVORManipulate,
+                [this](VORBaseUnknown*, VORNotification* n, void*) { OnManipulate(n); });
+    AddCallback(_manipulator->GetEventPublisher(), VORManipulator::kVOREndManipulate,
+                [this](VORBaseUnknown*, VORNotification* n, void*) { OnEndManipulate(n); });
+  }
+  SetWindowRootNode(root, NULL_var);
+}
+
+QELPertController::~QELPertController() {
+  ClearChart();
+  if (_manipulator) {
+    _manipulator->RemoveAllElements();
+    _manipulator->SetFather(nullptr);
+  }
+  if (_viewer) {
+    _viewer->RemoveRep(_chart);
+    if (auto* pertViewer = dynamic_cast<QELPertViewer*>(_viewer.get());
+        pertViewer && pertViewer->GetController() == this)
+      pertViewer->SetController(nullptr);
+  }
+}
+
+void QELPertController::SetWindowRootNode(VORBaseUnknown* root, VORBaseUnknown_var) {
+  if (!_nodes.empty())
+    RemoveAllPertNodes();
+  _root = root ? root->GetIdentity() : nullptr;
+  _top->owner = _root.get();
+  if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(_root))
+    ext->SetReference(_root);
+}
+
+QELPertController::Node* QELPertController::Find(VORBaseUnknown* node) const {
+  auto it = _nodes.find(Key(node));
+  return it == _nodes.end() ? nullptr : it->second.get();
+}
+
+bool QELPertController::IsInChart(VORBaseUnknown* node) const {
+  return Find(node) != nullptr;
+}
+
+VOR2DBagRep* QELPertController::GetNodeRep(VORBaseUnknown* node) const {
+  Node* n = Find(node);
+  return n ? n->bag.get() : nullptr;
+}
+
+int QELPertController::GetLinkCount() const {
+  size_t ends = 0;
+  for (const auto& [key, node] : _nodes)
+    ends += node->links.size();
+  return static_cast<int>(ends / 2);
+}
+
+void QELPertController::ReadPosition(Node* node) {
+  QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object);
+  double x = 0.0;
+  double y = 0.0;
+  if (ext != nullptr && ext->GetPosition(x, y, 1) != S_OK && ext->HasProvisionalPosition())
+    ext->GetProvisionalPosition(x, y);
+  node->x = x;
+  node->y = y;
+}
+
+HRESULT QELPertController::AddChildNode(VORBaseUnknown_var& node) {
+  VORIGENode_var graphNode(node);
+  if (!graphNode)
+    return E_INVALIDARG;
+  if (Find(node) != nullptr)
+    return S_FALSE;
+  // A child of a super node whose inner chart is shown goes into that chart.
+  Level* level = _top.get();
+  VORBaseUnknown_var parent;
+  if (graphNode->GetParentNode(parent) == S_OK && parent && Key(parent) != Key(_root)) {
+    if (Node* owner = Find(parent); owner != nullptr && owner->inner)
+      level = owner->inner.get();
+  }
+  Node* added = AddNode(node, level);
+  if (level->ownerNode != nullptr)
+    ResizeOwners(added);
+  return S_OK;
+}
+
+QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Level* level) {
+  auto owned = std::make_unique<Node>();
+  Node* node = owned.get();
+  node->object = Key(object);
+  node->level = level;
+  _nodes.emplace(Key(object), std::move(owned));
+  level->members.push_back(node);
+  ReadPosition(node);
+
+  node->bag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  node->bag->SetTag("PertNode");
+  node->bag->SetObject(node->object);
+  const std::vector<VORMathPoint2Df> empty = BoxPoints(0.0, 0.0);
+  auto box = VORHandle<VOR2DPolygonRep>::Adopt(new VOR2DPolygonRep(empty, 1));
+  box->SetFillColorIndex(QELPertParameters::NodeFillColor);
+  box->SetColorIndex(QELPertParameters::NodeBorderColor);
+  node->bag->AddChild(box);
+  auto label = VORHandle<VOR2DTextRep>::Adopt(new VOR2DTextRep(
+      LabelOf(object), VORMathPoint2Df(), 2, QELPertParameters::PERT_LABEL_HEIGHT));
+  label->SetTag("PertLabel");
+  label->SetColorIndex(QELPertParameters::NodeBorderColor);
+  node->bag->AddChild(label);
+  level->nodes->AddChild(node->bag);
+  if (_manipulator)
+    _manipulator->AddElement(node->bag);
+
+  if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(object)) {
+    ext->SetReference(_root);
+    ext->SetHiddenFlag(false);
+  }
+  BuildShape(node);
+  PlaceNode(node);
+  AddLinksOf(node);
+  Announce(object, 0);
+
+  QELIPertNodeExt_var ext(object);
+  if (ext && ext->GetState(1) == PertNodeExpanded) {
+    ShowInnerNodes(object);
+  }
+  return node;
+}
+
+void QELPertController::BuildShape(Node* node) {
+  const double labelHeight = QELPertParameters::PERT_LABEL_HEIGHT;
+  auto* box = static_cast<VOR2DPolygonRep*>(node->bag->GetChild(1));
+  auto* label = static_cast<VOR2DTextRep*>(node->bag->GetChild(2));
+  const VORUnicodeString text = LabelOf(node->object);
+  label->SetText(text);
+  label->SetHeight(labelHeight);
+
+  double w = 0.0;
+  double h = 0.0;
+  {
+    QELIPertNode_var pertNode(node->object);
+    QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object);
+    if (ext)
+      ext->SetDrawnSize(0.0, 0.0);  // read the document's size, not the last drawing
+    if (pertNode)
+      pertNode->GetSize(w, h);
+    const bool documentSize =
+        w != QELPertParameters::PERT_NODE_WIDTH || h != QELPertParameters::PERT_NODE_HEIGHT;
+    if (!documentSize) {
+      const double labelWidth = VORTextMetric::TextWidth(text.GetLengthInChar(), labelHeight);
+      w = std::max(w, labelWidth + 2.0 * labelHeight);
+    }
+  }
+  int state = PertNodeNone;
+  if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object))
+    state = ext->GetState(1);
+  double labelY = 0.0;
+  if (node->inner && !node->inner->members.empty()) {
+    // Enlarged box centred on the node, holding the inner chart and the label above it.
+    const double margin = QELPertParameters::PERT_SUPER_NODE_MARGIN;
+    double hw = w * 0.5;
+    double hh = h * 0.5;
+    for (Node* m : node->inner->members) {
+      hw = std::max(hw, std::fabs(m->x - node->x) + m->w * 0.5 + margin);
+      hh = std::max(hh, std::fabs(m->y - node->y) + m->h * 0.5 + margin + labelHeight);
+    }
+    w = 2.0 * hw;
+    h = 2.0 * hh;
+    labelY = hh - 0.5 - labelHeight * 0.5;
+  }
+  node->w = w;
+  node->h = h;
+  box->Modify(BoxPoints(w, h));
+  // A super node (expanded or collapsed) has a double-weight border.
+  box->SetLineThickness(state == PertNodeNone ? 1 : 2);
+  label->Modify(VORMathPoint2Df(0.0f, static_cast<float>(labelY)));
+  if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object))
+    ext->SetDrawnSize(w, h);
+}
+
+void QELPertController::PlaceNode(Node* node) {
+  double ox = 0.0;
+  double oy = 0.0;
+  if (node->level->ownerNode != nullptr) {
+    ox = node->level->ownerNode->x;
+    oy = node->level->ownerNode->y;
+  }
+  node->bag->SetMatrix(VOR3x3Matrix::Translation(node->x - ox, node->y - oy));
+}
+
+void QELPertController::AddLinksOf(Node* node) {
+  VORISPPFlowMgt_var flow(node->object);
+  if (!flow)
+    return;
+  auto link = [this](Node* from, Node* to) {
+    if (from == to || from->level != to->level)
+      return;
+    for (Link* existing : from->links) {
+      if (existing->from == from && existing->to == to)
+        return;
+    }
+    auto owned = std::make_unique<Link>();
+    Link* l = owned.get();
+    l->from = from;
+    l->to = to;
+    l->rep = VOR2DCustomRep_var::Adopt(new VOR2DCustomRep());
+    l->rep->SetTag("PertLink");
+    from->level->links->AddChild(l->rep);
+    from->level->linkList.push_back(std::move(owned));
+    from->links.push_back(l);
+    to->links.push_back(l);
+    UpdateLink(l);
+  };
+  VORListValVORBaseUnknown_var* next = nullptr;
+  if (SUCCEEDED(flow->GetNextActivities(next, "")) && next != nullptr) {
+    for (const VORBaseUnknown_var& n : *next) {
+      if (Node* other = Find(n))
+        link(node, other);
+    }
+  }
+  delete next;
+  VORListValVORBaseUnknown_var* previous = nullptr;
+  if (SUCCEEDED(flow->GetPreviousActivities(previous, "")) && previous != nullptr) {
+    for (const VORBaseUnknown_var& p : *previous) {
+      if (Node* other = Find(p))
+        link(other, node);
+    }
+  }
+  delete previous;
+}
+
+void QELPertController::UpdateLink(Link* link) {
+  double ox = 0.0;
+  double oy = 0.0;
+  if (link->from->level->ownerNode != nullptr) {
+    ox = link->from->level->ownerNode->x;
+    oy = link->from->level->ownerNode->y;
+  }
+  const Node* a = link->from;
+  const Node* b = link->to;
+  // From the right edge of the source to the left edge of the target; mirrored when the
+  // target lies to the left.
+  const bool forward = b->x >= a->x;
+  const double side = forward ? 1.0 : -1.0;
+  const VORMathPoint2Df p(static_cast<float>(a->x - ox + side * a->w * 0.5),
+                          static_cast<float>(a->y - oy));
+  const VORMathPoint2Df q(static_cast<float>(b->x - ox - side * b->w * 0.5),
+                          static_cast<float>(b->y - oy));
+  const auto m = static_cast<float>((p.x + q.x) * 0.5);
+  const VORMathPoint2Df route[4] = {p, {m, p.y}, {m, q.y}, q};
+  const std::uint32_t word =
+      VOR2DGraphicAttribute::Pack(QELPertParameters::LinkColor, 4, 1, 4, false, true);
+  link->rep->RemoveAllPrimitives();
+  link->rep->AddPrimitive(new VOR2DPolylineGP(route, 4, 1), word, 255);
+  link->rep->AddPrimitive(ArrowHead(p, q), word, 255);
+}
+
+void QELPertController::Announce(VORBaseUnknown* node, int removeRep) {
+  VORIModelEvents_var events(_root);
+  if (!events)
+    return;
+  auto notification = VORHandle<QELPertAppInfoNotify>::Adopt(
+      new QELPertAppInfoNotify(VORBaseUnknown_var(node), nullptr, removeRep));
+  events->Dispatch(notification);
+}
+
+void QELPertController::DispatchPosition(Node* node) {
+  QELIPertPosition_var position(node->object);
+  VORBaseUnknown_var reference;
+  if (!position || position->GetReferenceObject(reference) != S_OK)
+    return;
+  VORIModelEvents_var events(reference);
+  if (!events)
+    return;
+  auto notification = VORHandle<QELPertPositionNotify>::Adopt(
+      new QELPertPositionNotify(node->object, node->x, node->y));
+  events->Dispatch(notification);
+}
+
+HRESULT QELPertController::RefreshNodePositionInPert(VORBaseUnknown_var& object, bool redraw) {
+  Node* node = Find(object);
+  if (node == nullptr)
+    return E_FAIL;
+  const double oldX = node->x;
+  const double oldY = node->y;
+  ReadPosition(node);
+  if (node->inner && (node->x != oldX || node->y != oldY))
+    ShiftInner(node, node->x - oldX, node->y - oldY);
+  PlaceNode(node);
+  for (Link* link : node->links)
+    UpdateLink(link);
+  ResizeOwners(node);
+  if (redraw && _viewer)
+    _viewer->Draw();
+  return S_OK;
+}
+
+void QELPertController::ShiftInner(Node* node, double dx, double dy) {
+  if (!node->inner)
+    return;
+  // Inner boxes are placed relative to their super node: only their positions follow.
+  for (Node* m : node->inner->members) {
+    m->x += dx;
+    m->y += dy;
+    if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(m->object))
+      ext->SetPosition(m->x, m->y, 1);
+    ShiftInner(m, dx, dy);
+  }
+}
+
+void QELPertController::ResizeOwners(Node* node) {
+  for (Node* owner = node->level->ownerNode; owner != nullptr; owner = owner->level->ownerNode) {
+    BuildShape(owner);
+    for (Link* link : owner->links)
+      UpdateLink(link);
+  }
+}
+
+HRESULT QELPertController::ShowInnerNodes(VORBaseUnknown* superNode) {
+  Node* node = Find(superNode);
+  if (node == nullptr)
+    return E_FAIL;
+  if (node->inner)
+    return S_FALSE;
+  VORIGENode_var graphNode(node->object);
+  VORListValVORBaseUnknown_var* children = nullptr;
+  if (!graphNode || FAILED(graphNode->GetChildren(children)) || children == nullptr) {
+    delete children;
+    return E_FAIL;
+  }
+  auto level = std::make_unique<Level>();
+  level->owner = node->object;
+  level->ownerNode = node;
+  level->links = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  level->nodes = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  node->bag->AddChild(level->links);
+  node->bag->AddChild(level->nodes);
+  node->inner = std::move(level);
+
+  // Inner nodes never placed get a row; then the inner chart is centred on its super node so
+  // that it moves with it.
+  std::vector<VORBaseUnknown*> shown;
+  VORBox2D extent;
+  int unplaced = 0;
+  for (const VORBaseUnknown_var& child : *children) {
+    VORIGENode_var childNode(child);
+    QELEPertNodeExt* ext = QELEPertNodeExt::Of(child);
+    if (!childNode || ext == nullptr || Find(child) != nullptr)
+      continue;
+    double x = 0.0;
+    double y = 0.0;
+    if (ext->GetPosition(x, y, 1) != S_OK) {
+      x = 2.0 * QELPertParameters::PERT_GRID_CELL_SIZE * unplaced++;
+      y = 0.0;
+      ext->SetPosition(x, y, 1);
+    }
+    extent.Extend(x, y);
+    shown.push_back(child);
+  }
+  delete children;
+  if (!shown.empty()) {
+    const double dx = node->x - extent.CentreX();
+    const double dy = node->y - extent.CentreY();
+    for (VORBaseUnknown* child : shown) {
+      QELEPertNodeExt* ext = QELEPertNodeExt::Of(child);
+      double x = 0.0;
+      double y = 0.0;
+      ext->GetPosition(x, y, 1);
+      if (dx != 0.0 || dy != 0.0)
+        ext->SetPosition(x + dx, y + dy, 1);
+      AddNode(child, node->inner.get());
+    }
+  }
+  BuildShape(node);
+  for (Link* link : node->links)
+    UpdateLink(link);
+  ResizeOwners(node);
+  return S_OK;
+}
+
+void QELPertController::RemoveNode(Node* node, bool announce) {
+  if (node->inner) {
+    std::vector<Node*> members = node->inner->members;
+    for (Node* m : members)
+      RemoveNode(m, announce);
+  }
+  // Links touching the node go from both ends and from their level.
+  Level* level = node->level;
+  for (Link* link : std::vector<Link*>(node->links)) {
+    Node* other = link->from == node ? link->to : link->from;
+    std::erase(other->links, link);
+    level->links->RemoveChild(link->rep);
+    std::erase_if(level->linkList, [link](const auto& l) { return l.get() == link; });
+  }
+  node->links.clear();
+  std::erase(level->members, node);
+  if (_manipulator)
+    _manipulator->RemoveElement(node->bag);
+  level->nodes->RemoveChild(node->bag);
+  VORBaseUnknown_var object = node->object;
+  if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(object)) {
+    ext->SetReference(nullptr);
+    ext->SetDrawnSize(0.0, 0.0);
+    ext->SetHiddenFlag(announce);
+  }
+  _nodes.erase(Key(object));
+  if (announce)
+    Announce(object, 1);
+}
+
+HRESULT QELPertController::HideInnerNodes(VORBaseUnknown* superNode) {
+  Node* node = Find(superNode);
+  if (node == nullptr)
+    return E_FAIL;
+  if (!node->inner)
+    return S_FALSE;
+  std::vector<Node*> members = node->inner->members;
+  for (Node* m : members)
+    RemoveNode(m, true);
+  node->bag->RemoveChild(node->inner->links);
+  node->bag->RemoveChild(node->inner->nodes);
+  node->inner.reset();
+  BuildShape(node);
+  for (Link* link : node->links)
+    UpdateLink(link);
+  ResizeOwners(node);
+  return S_OK;
+}
+
+HRESULT QELPertController::UpdateNodeShape(VORBaseUnknown* object) {
+  Node* node = Find(object);
+  if (node == nullptr)
+    return E_FAIL;
+  BuildShape(node);
+  for (Link* link : node->links)
+    UpdateLink(link);
+  ResizeOwners(node);
+  return S_OK;
+}
+
+HRESULT QELPertController::RemoveChildNode(VORBaseUnknown_var& object) {
+  Node* node = Find(object);
+  if (node == nullptr)
+    return S_FALSE;
+  Node* owner = node->level->ownerNode;
+  RemoveNode(node, true);
+  if (owner != nullptr) {
+    BuildShape(owner);
+    for (Link* link : owner->links)
+      UpdateLink(link);
+    ResizeOwners(owner);
+  }
+  return S_OK;
+}
+
+void QELPertController::ClearChart() {
+  for (auto& [key, node] : _nodes) {
+    if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(key)) {
+      ext->SetReference(nullptr);
+      ext->SetDrawnSize(0.0, 0.0);
+      ext->SetHiddenFlag(false);
+    }
+  }
+  if (_manipulator)
+    _manipulator->RemoveAllElements();
+  _nodes.clear();
+  _top->members.clear();
+  _top->linkList.clear();
+  _top->nodes->EmptyBag();
+  _top->links->EmptyBag();
+}
+
+void QELPertController::RemoveAllPertNodes() {
+  // The window removes what it attached to the nodes itself: no announcements here.
+  if (_viewer)
+    _viewer->ClearPreselection();
+  ClearChart();
+}
+
+void QELPertController::RemoveNodeManipCmdCB() {
+  if (_manipulator)
+    RemoveCallbacksOn(_manipulator->GetEventPublisher());
+}
+
+void QELPertController::RefreshLinks() {
+  std::vector<Level*> levels{_top.get()};
+  for (auto& [key, node] : _nodes) {
+    node->links.clear();
+    if (node->inner)
+      levels.push_back(node->inner.get());
+  }
+  for (Level* level : levels) {
+    level->linkList.clear();
+    level->links->EmptyBag();
+  }
+  for (auto& [key, node] : _nodes)
+    AddLinksOf(node.get());
+}
+
+QELPertController::Node* QELPertController::DraggedNode() const {
+  if (!_manipulator || _manipulator->GetPressedElement() == nullptr)
+    return nullptr;
+  return Find(_manipulator->GetPressedElement()->GetObject());
+}
+
+void QELPertController::OnManipulate(VORNotification* notification) {
+  auto* step = dynamic_cast<VORManipulatorNotification*>(notification);
+  Node* node = DraggedNode();
+  if (step == nullptr || node == nullptr)
+    return;
+  QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object);
+  if (ext == nullptr)
+    return;
+  ext->SetPosition(node->x + step->GetDelta().x, node->y + step->GetDelta().y, 1);
+  VORBaseUnknown_var object = node->object;
+  RefreshNodePositionInPert(object, true);
+  DispatchPosition(node);
+}
+
+void QELPertController::OnEndManipulate(VORNotification*) {
+  Node* node = DraggedNode();
+  if (node == nullptr)
+    return;
+  double x = node->x;
+  double y = node->y;
+  QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 1, QELIPertNode_var());
+  // The snapped position goes into the document: one change for the node and each inner node.
+  QELIPertNode_var pertNode(node->object);
+  if (pertNode)
+    pertNode->SetPosition(x, y, 1);
+  VORBaseUnknown_var object = node->object;
+  RefreshNodePositionInPert(object, true);
+  std::vector<Node*> inner;
+  if (node->inner)
+    inner = node->inner->members;
+  for (size_t i = 0; i < inner.size(); ++i) {
+    QELIPertNode_var m(inner[i]->object);
+    if (m)
+      m->SetPosition(inner[i]->x, inner[i]->y, 1);
+    if (inner[i]->inner)
+      inner.insert(inner.end(), inner[i]->inner->members.begin(), inner[i]->inner->members.end());
+  }
+  DispatchPosition(node);
+}

@@ -1,0 +1,60 @@
+// The data extension behind QELIPertNodeExt, seen by the rest of the graph editor.
+#pragma once
+
+#include "QELIPertNodeExt.h"
+#include "VORExtension.h"
+
+class QELEPertNodeExt : public VORExtension, public QELIPertNodeExt {
+  VOR_DECLARE_CLASS(QELEPertNodeExt, VORExtension)
+ public:
+  QELEPertNodeExt() = default;
+
+  HRESULT GetPosition(double& x, double& y, GE_POSITION_INDEX index = 1) override;
+  HRESULT SetPosition(double x, double y, GE_POSITION_INDEX index = 1) override;
+  bool HasPosition() override { return _hasPosition; }
+  void ResetPosition() override { _hasPosition = false; }
+  int GetState(int query = 1) override;
+  HRESULT SetState(int state) override;
+  bool GetHiddenFlag() override { return _hidden; }
+
+  // Graph-editor internals.
+  bool HasProvisionalPosition() const { return _hasProvisional; }
+  void GetProvisionalPosition(double& x, double& y) const {
+    x = _px;
+    y = _py;
+  }
+  void SetProvisionalPosition(double x, double y) {
+    _px = x;
+    _py = y;
+    _hasProvisional = true;
+  }
+  void SetHiddenFlag(bool hidden) { _hidden = hidden; }
+  // The chart root that shows the node; not held (a chart root outlives the nodes it shows,
+  // and the controller clears it when it lets the node go).
+  VORBaseUnknown* GetReference() const { return _reference; }
+  void SetReference(VORBaseUnknown* reference) { _reference = reference; }
+  // Size of the box the controller drew (0 when not drawn).
+  void SetDrawnSize(double w, double h) {
+    _drawnW = w;
+    _drawnH = h;
+  }
+  void GetDrawnSize(double& w, double& h) const {
+    w = _drawnW;
+    h = _drawnH;
+  }
+
+  // The extension of node (created on first use); null for objects that are no graph nodes.
+  static QELEPertNodeExt* Of(VORBaseUnknown* node);
+
+ private:
+  bool _hasPosition = false;
+  double _x = 0.0;
+  double _y = 0.0;
+  bool _hasProvisional = false;
+  double _px = 0.0;
+  double _py = 0.0;
+  bool _hidden = false;
+  VORBaseUnknown* _reference = nullptr;
+  double _drawnW = 0.0;
+  double _drawnH = 0.0;
+};

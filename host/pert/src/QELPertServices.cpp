@@ -1,0 +1,201 @@
+#include <cmath>
+#include <unordered_map>
+
+#include "QELFpaPertServices.h"
+#include "QELPertClientVisuServices.h"
+#include "QELPertNodeData.h"
+#include "QELPertNodeTraverser.h"
+#include "QELPertController.h"
+#include "VORIGraphNodeLayout.h"
+
+namespace {
+
+// Grid lines over the area of the viewer's other reps; no box of its own, never picked.
+class QELPertGridRep : public VOR2DRep {
+  VOR_DECLARE_CLASS(QELPertGridRep, VOR2DRep)
+ public:
+  explicit QELPertGridRep(VORViewer* viewer) : _viewer(viewer) { SetTag("PertGrid"); }
+  bool HitTest(const VORMathPoint2D&, double) const override { return false; }
+
+ protected:
+  VORBox2D ComputeBoundingBox() const override { return VORBox2D(); }
+  void FlattenShown(VORFlattenContext& context) const override {
+    VORBox2D area;
+    for (const VOR2DRep_var& rep : _viewer->GetReps()) {
+      if (rep.get() != this && rep->IsShown())
+        area.Extend(rep->GetBoundingBox());
+    }
+    if (area.IsEmpty())
+      return;
+    double cell = QELPertParameters::PERT_GRID_CELL_SIZE;
+    if (!(cell > 0.0))
+      return;
+    area = area.Inflated(2.0 * cell);
+    // Coarser lines rather than an unbounded number of them.
+    while ((area.Width() + area.Height()) / cell > 2000.0)
+      cell *= 2.0;
+    const double x0 = std::floor(area.xmin / cell) * cell;
+    const double y0 = std::floor(area.ymin / cell) * cell;
+    const double x1 = std::ceil(area.xmax / cell) * cell;
+    const double y1 = std::ceil(area.ymax / cell) * cell;
+    auto line = [&](double ax, double ay, double bx, double by) {
+      VORRenderItem& item = AddItem(context, VORPrimitiveKind::Line);
+      item.color = VORColorFromIndex(QELPertParameters::GridColor);
+      item.points = {context.matrix.Transform(ax, ay), context.matrix.Transform(bx, by)};
+      item.box = VORBox2D(item.points[0].x, item.points[0].y, item.points[1].x, item.points[1].y);
+    };
+    for (double x = x0; x <= x1 + cell * 0.5; x += cell)
+      line(x, y0, x, y1);
+    for (double y = y0; y <= y1 + cell * 0.5; y += cell)
+      line(x0, y, x1, y);
+  }
+
+ private:
+  VORViewer* _viewer;
+};
+
+ViewerName& CurrentViewerName() {
+  static ViewerName name = PertViewerClassic;
+  return name;
+}
+
+double Snap(double v, double cell) {
+  const double half = cell * 0.5;
+  return std::floor((v - half) / cell + 0.5) * cell + half;
+}
+
+}  // namespace
+
+VOR2DRep* QELPertClientVisuServices::CreateGrid(VOR2DViewer* viewer) {
+  if (viewer == nullptr)
+    return nullptr;
+  auto* grid = new QELPertGridRep(viewer);
+  grid->SetColorIndex(QELPertParameters::GridColor);
+  viewer->AddRep(grid);
+  return grid;
+}
+
+void QELPertClientVisuServices::SetViewerName(ViewerName& name) {
+  CurrentViewerName() = name;
+}
+
+ViewerName QELPertClientVisuServices::GetViewerName() {
+  return CurrentViewerName();
+}
+
+HRESULT QELPertClientVisuServices::SetChildPertPositions(VORIGENode_var& node,
+                                                         GE_POSITION_INDEX index) {
+  if (!node)
+    return E_FAIL;
+  if (index != 1)
+    return E_INVALIDARG;
+  VORListValVORBaseUnknown_var* children = nullptr;
+  if (FAILED(node->GetChildren(children)) || children == nullptr) {
+    delete children;
+    return E_FAIL;
+  }
+  for (const VORBaseUnknown_var& child : *children) {
+    QELEPertNodeExt* ext = QELEPertNodeExt::Of(child);
+    if (ext == nullptr)
+      continue;
+    ext->ResetPosition();
+    VORIGENode_var childNode(child);
+    QELFpaPertBaseServices::InitNodePosition(childNode);
+  }
+  delete children;
+  return S_OK;
+}
+
+HRESULT QELPertClientVisuServices::CalculateSnapPositionInPert(double& x, double& y,
+                                                               GE_POSITION_INDEX,
+                                                               const QELIPertNode_var&) {
+  const double cell = QELPertParameters::PERT_GRID_CELL_SIZE;
+  if (!(cell > 0.0) || !std::isfinite(x) || !std::isfinite(y))
+    return E_FAIL;
+  x = Snap(x, cell);
+  y = Snap(y, cell);
+  return S_OK;
+}
+
+QELIPertNodeExt_var QELFpaPertBaseServices::GetPertExtension(VORIGENode_var& node, bool& created) {
+  created = false;
+  if (!node)
+    return QELIPertNodeExt_var();
+  // Extensions are made on first query: remember which nodes were asked before.
+  static std::unordered_map<VORBaseUnknown*, const void*> known;
+  QELIPertNodeExt_var ext(node);
+  if (!ext)
+    return ext;
+  VORBaseUnknown* key = node.Identity();
+  auto it = known.find(key);
+  if (it == known.end() || it->second != ext.get()) {
+    // A new object at a recycled address has a new extension as well.
+    known[key] = ext.get();
+    created = true;
+  }
+  return ext;
+}
+
+HRESULT QELFpaPertBaseServices::InitNodePosition(VORIGENode_var& node) {
+  QELEPertNodeExt* ext = node ? QELEPertNodeExt::Of(node) : nullptr;
+  if (ext == nullptr)
+    return E_FAIL;
+  VORIGraphNodeLayout_var layout(node);
+  if (layout && layout->HasPertPosition())
+    return S_FALSE;
+  // Index among the siblings, from a cached table of the last parent asked about.
+  static VORBaseUnknown* lastParent = nullptr;
+  static std::unordered_map<VORBaseUnknown*, int> indexes;
+  VORBaseUnknown_var parent;
+  int index = 0;
+  if (node->GetParentNode(parent) == S_OK && parent) {
+    auto it = indexes.find(node.Identity());
+    if (lastParent != parent.Identity() || it == indexes.end()) {
+      indexes.clear();
+      lastParent = parent.Identity();
+      VORIGENode_var parentNode(parent);
+      VORListValVORBaseUnknown_var* siblings = nullptr;
+      if (parentNode && SUCCEEDED(parentNode->GetChildren(siblings)) && siblings != nullptr) {
+        int i = 0;
+        for (const VORBaseUnknown_var& s : *siblings)
+          indexes[s.Identity()] = i++;
+      }
+      delete siblings;
+      it = indexes.find(node.Identity());
+    }
+    if (it != indexes.end())
+      index = it->second;
+  }
+  double x = 2.0 * QELPertParameters::PERT_GRID_CELL_SIZE * index;
+  double y = 0.0;
+  QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 0, QELIPertNode_var());
+  ext->SetProvisionalPosition(x, y);
+  return S_OK;
+}
+
+QELPertNodeTraverser::QELPertNodeTraverser(QELPertController* controller)
+    : VORCommand(nullptr, "QELPertNodeTraverser"), _controller(controller) {}
+
+HRESULT QELPertNodeTraverser::HideChildrenNodes(VORIGENode_var& node) {
+  if (_controller == nullptr || !node)
+    return E_FAIL;
+  return _controller->HideInnerNodes(node);
+}
+
+HRESULT QELPertNodeTraverser::ShowChildrenNodes(VORIGENode_var& node) {
+  if (_controller == nullptr || !node)
+    return E_FAIL;
+  return _controller->ShowInnerNodes(node);
+}
+
+HRESULT QELPertNodeTraverser::ChangePertNodeShape(PertNodeState state) {
+  QELIPertNodeExt_var ext(_model);
+  if (!ext)
+    return E_FAIL;
+  const HRESULT hr = ext->SetState(state);
+  if (FAILED(hr))
+    return hr;
+  if (_controller != nullptr && _controller->IsInChart(_model))
+    _controller->UpdateNodeShape(_model);
+  return S_OK;
+}
