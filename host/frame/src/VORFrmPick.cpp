@@ -32,8 +32,7 @@ VORFrmPickNotification::Result VORFrmDispatchPick(VORFrmEditor* editor,
     return Announce(nullptr, VORFrmPickNotification::Background);
   }
   VORPathElement* front = paths.front();
-  const bool toggle =
-      multiSelBehavior == 1 && (modifiers & (VORModShift | VORModControl)) != 0;
+  const bool toggle = multiSelBehavior == 1 && (modifiers & (VORModShift | VORModControl)) != 0;
   if (toggle) {
     if (!cso->RemoveElement(front))
       cso->AddElement(front);

@@ -43,14 +43,14 @@ void VORFrmWindow::SetViewer(VORViewer* viewer) {
   _viewer = viewer;
   if (!viewer)
     return;
-  _pickCallback = AddCallback(
-      viewer->GetEventPublisher(), VORViewer::kPickEvent,
-      [this](VORBaseUnknown*, VORNotification* n, void*) {
-        auto* pick = dynamic_cast<VORViewerPickNotification*>(n);
-        if (pick != nullptr)
-          VORFrmDispatchPick(_editor, pick->GetPaths(), pick->GetModifiers(),
-                             pick->GetMultiSelBehavior());
-      });
+  _pickCallback =
+      AddCallback(viewer->GetEventPublisher(), VORViewer::kPickEvent,
+                  [this](VORBaseUnknown*, VORNotification* n, void*) {
+                    auto* pick = dynamic_cast<VORViewerPickNotification*>(n);
+                    if (pick != nullptr)
+                      VORFrmDispatchPick(_editor, pick->GetPaths(), pick->GetModifiers(),
+                                         pick->GetMultiSelBehavior());
+                  });
 }
 
 void VORFrmWindow::SetRectangle(const VORRectangle& r) {
