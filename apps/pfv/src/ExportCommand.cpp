@@ -1,0 +1,105 @@
+// pfv export <document> --activity <name or id> [--out chart.svg]: writes the PERT chart of the
+// activity's children as SVG (to standard output without --out).
+#include <cstdio>
+#include <string>
+
+#include "PfvCommand.h"
+#include "QELPertChart.h"
+#include "QELPertViewer.h"
+#include "VORDeferredDeletion.h"
+#include "VORModel.h"
+#include "VORSVGWriter.h"
+
+namespace {
+
+// The activity with that id, else the first one in document order whose label is name.
+VORBaseUnknown_var FindActivity(VORProcess* doc, const std::string& key) {
+  VORBaseUnknown_var byId(doc->FindObject(key));
+  if (byId && VORISPPActivity_var(byId))
+    return byId;
+  const VORUnicodeString wanted(key);
+  std::vector<VORBaseUnknown_var> stack{doc->GetRootProcess()};
+  while (!stack.empty()) {
+    VORBaseUnknown_var object = stack.back();
+    stack.pop_back();
+    VORIGENode_var node(object);
+    if (!node)
+      continue;
+    VORUnicodeString label;
+    node->GetLabel(label);
+    if (label == wanted && VORISPPActivity_var(object))
+      return object;
+    VORListValVORBaseUnknown_var* children = nullptr;
+    if (SUCCEEDED(node->GetChildren(children)) && children != nullptr) {
+      for (int i = children->Size(); i >= 1; --i)
+        stack.push_back((*children)[i]);
+    }
+    delete children;
+  }
+  return VORBaseUnknown_var();
+}
+
+int RunExport(const std::vector<std::string>& args) {
+  std::string document;
+  std::string activity;
+  std::string out;
+  bool usage = false;
+  for (size_t i = 0; i < args.size(); ++i) {
+    const std::string& a = args[i];
+    if (a == "--activity" && i + 1 < args.size()) {
+      activity = args[++i];
+    } else if (a == "--out" && i + 1 < args.size()) {
+      out = args[++i];
+    } else if (!a.empty() && a[0] != '-' && document.empty()) {
+      document = a;
+    } else {
+      usage = true;
+    }
+  }
+  if (usage || document.empty() || activity.empty()) {
+    std::fprintf(stderr,
+                 "Usage: pfv export <document.pprx> --activity <name or id> [--out chart.svg]\n");
+    return 2;
+  }
+  std::string error;
+  VORProcess_var doc = VORProcess_var::Adopt(VORProcess::Load(document, error));
+  if (!doc) {
+    std::fprintf(stderr, "pfv export: %s\n", error.c_str());
+    return 1;
+  }
+  VORBaseUnknown_var root = FindActivity(doc, activity);
+  if (!root) {
+    std::fprintf(stderr, "pfv export: %s: no activity with the id or label \"%s\"\n",
+                 document.c_str(), activity.c_str());
+    return 1;
+  }
+  int status = 0;
+  {
+    auto viewer = VORHandle<QELPertViewer>::Adopt(
+        new QELPertViewer(nullptr, "Export", QELPertParameters::PERT_VIEWER_STYLE, 800, 500,
+                          QELPertParameters::PERT_VIEWER_FLAGS));
+    auto controller = VORHandle<QELPertController>::Adopt(QELPertBuildChart(root, viewer));
+    if (!controller) {
+      std::fprintf(stderr, "pfv export: \"%s\" cannot be shown as a chart\n", activity.c_str());
+      return 1;
+    }
+    const std::string svg = VORSVGWriter::ToString(*viewer);
+    if (out.empty()) {
+      std::fwrite(svg.data(), 1, svg.size(), stdout);
+    } else if (!VORSVGWriter::WriteFile(*viewer, out, error)) {
+      std::fprintf(stderr, "pfv export: %s\n", error.c_str());
+      status = 1;
+    } else {
+      std::fprintf(stderr, "pfv export: wrote %s (%d nodes, %d links)\n", out.c_str(),
+                   controller->GetNodeCount(), controller->GetLinkCount());
+    }
+    controller->RemoveAllPertNodes();
+  }
+  VORDeferredDeletion::Drain();
+  return status;
+}
+
+}  // namespace
+
+PFV_COMMAND(export, "export", "<document.pprx> --activity <name or id> [--out chart.svg]",
+            "write the PERT chart of an activity's children as SVG", RunExport);
