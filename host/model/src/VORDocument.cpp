@@ -31,17 +31,17 @@ std::string VORDocumentData::NewId(const char* prefix) {
 
 void VORDocumentData::Register(VORModelObject* object, const std::string& wantedId) {
   const char* prefix = "X";
-  if (dynamic_cast<VORActivityImpl*>(object))
+  if (VORKindCast<VORActivityImpl>(object))
     prefix = "A";
-  else if (dynamic_cast<VORControlNodeImpl*>(object))
+  else if (VORKindCast<VORControlNodeImpl>(object))
     prefix = "N";
-  else if (dynamic_cast<VORProductIOImpl*>(object))
+  else if (VORKindCast<VORProductIOImpl>(object))
     prefix = "IO";
-  else if (dynamic_cast<VORProductImpl*>(object))
+  else if (VORKindCast<VORProductImpl>(object))
     prefix = "P";
-  else if (dynamic_cast<VORMfgAssemblyImpl*>(object))
+  else if (VORKindCast<VORMfgAssemblyImpl>(object))
     prefix = "M";
-  else if (dynamic_cast<VORPlanTypeImpl*>(object))
+  else if (VORKindCast<VORPlanTypeImpl>(object))
     prefix = "T";
   object->id = wantedId.empty() || ids.count(wantedId) ? NewId(prefix) : wantedId;
   object->data = this;
@@ -97,7 +97,7 @@ void VORDocumentData::DetachAll() {
     o->out.clear();
     o->in.clear();
     o->data = nullptr;
-    if (auto* n = dynamic_cast<VORGraphNodeImpl*>(o)) {
+    if (auto* n = VORKindCast<VORGraphNodeImpl>(o)) {
       n->next.clear();
       n->previous.clear();
     }
@@ -441,18 +441,18 @@ VORBaseUnknown* VORProcess::FindObject(const std::string& id) {
 VORProcessStatistics VORProcess::GetStatistics() {
   VORProcessStatistics s;
   for (VORModelObject* o : _data->AllObjects()) {
-    if (auto* n = dynamic_cast<VORGraphNodeImpl*>(o)) {
+    if (auto* n = VORKindCast<VORGraphNodeImpl>(o)) {
       (n->AsActivity() ? s.activities : s.controlNodes)++;
       s.flows += static_cast<int>(n->next.size());
-    } else if (dynamic_cast<VORProductIOImpl*>(o)) {
+    } else if (VORKindCast<VORProductIOImpl>(o)) {
       s.productIOs++;
-    } else if (auto* p = dynamic_cast<VORProductImpl*>(o)) {
+    } else if (auto* p = VORKindCast<VORProductImpl>(o)) {
       s.products++;
       if (p->isResource)
         s.resources++;
-    } else if (dynamic_cast<VORMfgAssemblyImpl*>(o)) {
+    } else if (VORKindCast<VORMfgAssemblyImpl>(o)) {
       s.assemblies++;
-    } else if (dynamic_cast<VORPlanTypeImpl*>(o)) {
+    } else if (VORKindCast<VORPlanTypeImpl>(o)) {
       s.planTypes++;
     }
     for (const VORModelLink& l : o->out) {

@@ -55,9 +55,10 @@ class LoadError : public std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
-// Cached UTF-16 names, so that the loop does not transcode the same tag names again.
+// Cached UTF-16 names, so that the loop does not transcode the same tag names again. Keyed by
+// the literal's address: the same text at two addresses is only cached twice.
 struct Names {
-  std::unordered_map<std::string, std::u16string> cache;
+  std::unordered_map<const char*, std::u16string> cache;
   const XMLCh* operator()(const char* name) {
     auto it = cache.find(name);
     if (it == cache.end())
@@ -116,8 +117,16 @@ class Loader {
   }
 
   std::string Tag(const DOMElement* e) { return VORXercesPlatform::ToUTF8(e->getTagName()); }
+  bool IsTag(const DOMElement* e, const char* tag) {
+    return XMLString::equals(e->getTagName(), _names(tag));
+  }
   std::string Attr(const DOMElement* e, const char* name) {
     return VORXercesPlatform::ToUTF8(e->getAttribute(_names(name)));
+  }
+  // Attribute straight to the model's string type.
+  VORUnicodeString Text(const DOMElement* e, const char* name) {
+    return VORUnicodeString::FromUTF16(
+        reinterpret_cast<const char16_t*>(e->getAttribute(_names(name))));
   }
   bool Has(const DOMElement* e, const char* name) {
     return e->getAttributeNode(_names(name)) != nullptr;
@@ -170,7 +179,7 @@ class Loader {
     VORModelObject* o = _data.Find(id);
     if (o == nullptr)
       Fail(e, std::string(what) + " '" + id + "' does not exist");
-    T* t = dynamic_cast<T*>(o);
+    T* t = VORKindCast<T>(o);
     if (t == nullptr)
       Fail(e, "'" + id + "' is not " + what);
     return t;
@@ -180,7 +189,7 @@ class Loader {
     VORModelObject* o = _data.Find(id);
     if (o == nullptr)
       Fail(e, "item '" + id + "' does not exist");
-    if (!dynamic_cast<VORProductImpl*>(o) && !dynamic_cast<VORMfgAssemblyImpl*>(o))
+    if (!VORKindCast<VORProductImpl>(o) && !VORKindCast<VORMfgAssemblyImpl>(o))
       Fail(e, "'" + id + "' is not an item (a product or an assembly)");
     return o;
   }
@@ -191,9 +200,8 @@ class Loader {
   }
   void ExpectOnly(const DOMElement* e, std::initializer_list<const char*> tags) {
     for (DOMElement* c = e->getFirstElementChild(); c; c = c->getNextElementSibling()) {
-      const std::string tag = Tag(c);
-      if (std::none_of(tags.begin(), tags.end(), [&](const char* t) { return tag == t; }))
-        Fail(c, "unexpected element <" + tag + "> in <" + Tag(e) + ">");
+      if (std::none_of(tags.begin(), tags.end(), [&](const char* t) { return IsTag(c, t); }))
+        Fail(c, "unexpected element <" + Tag(c) + "> in <" + Tag(e) + ">");
     }
   }
 
@@ -281,7 +289,7 @@ class Loader {
     for (DOMElement* e = products->getFirstElementChild(); e; e = e->getNextElementSibling()) {
       auto p = VORHandle<VORProductImpl>::Adopt(new VORProductImpl());
       Register(p.get(), NewId(e));
-      p->partNumber = VORUnicodeString(Attr(e, "name"));
+      p->partNumber = Text(e, "name");
       p->alias = VORUnicodeString(Attr(e, "alias"));
       p->shown = Long(e, "shown", 1, p->id) != 0;
       if (Has(e, "resourceClass")) {
@@ -386,10 +394,9 @@ class Loader {
   }
 
   VORGraphNodeImpl* MakeNode(DOMElement* e) {
-    const std::string tag = Tag(e);
     const std::string type = Required(e, "type");
     VORGraphNodeImpl* node = nullptr;
-    if (tag == "activity") {
+    if (IsTag(e, "activity")) {
       if (!VORModelLateTypes::IsActivityType(type) || type == VORModelLateTypes::Root)
         Fail(e, "unknown activity type '" + type + "'");
       if (type == VORModelLateTypes::Station)
@@ -408,7 +415,7 @@ class Loader {
 
   void LoadNodeBody(DOMElement* e, VORGraphNodeImpl* node) {
     const std::string& id = node->id;
-    node->label = VORUnicodeString(Attr(e, "label"));
+    node->label = Text(e, "label");
     if (Has(e, "x") || Has(e, "y")) {
       node->hasPosition = true;
       node->x = Double(e, "x", 0, id);
@@ -427,26 +434,25 @@ class Loader {
     }
     a->time = Double(e, "time", 0, id);
     if (Has(e, "cycleTime")) {
-      if (dynamic_cast<VORStationImpl*>(a) == nullptr)
+      if (VORKindCast<VORStationImpl>(a) == nullptr)
         Fail(e, "'" + id + "': only stations have a cycle time");
       a->stationCycleTime = Double(e, "cycleTime", 0, id);
     }
     std::vector<DOMElement*> flows;
     for (DOMElement* c = e->getFirstElementChild(); c; c = c->getNextElementSibling()) {
-      const std::string tag = Tag(c);
-      if (tag == "activity" || tag == "node") {
+      if (IsTag(c, "activity") || IsTag(c, "node")) {
         auto child = VORHandle<VORGraphNodeImpl>::Adopt(MakeNode(c));
         Register(child.get(), NewId(c));
         child->father = a;
         a->children.push_back(child);
         LoadNodeBody(c, child.get());
-      } else if (tag == "input" || tag == "output") {
-        auto io = VORHandle<VORProductIOImpl>::Adopt(new VORProductIOImpl(tag == "input"));
+      } else if (IsTag(c, "input") || IsTag(c, "output")) {
+        auto io = VORHandle<VORProductIOImpl>::Adopt(new VORProductIOImpl(IsTag(c, "input")));
         Register(io.get(), NewId(c));
         io->activity = a;
         Link(io.get(), ItemRef(c, "item"), VORILinkableObject::IOItemLink);
         a->productIOs.push_back(io);
-      } else if (tag == "item") {
+      } else if (IsTag(c, "item")) {
         VORModelObject* item = ItemRef(c, "ref");
         if (a->FindLink(item, VORILinkableObject::ItemLink))
           Fail(c, "'" + id + "': item '" + item->id + "' assigned twice");
@@ -457,28 +463,28 @@ class Loader {
             Fail(c, "'" + id + "': '" + via->id + "' is not a product input of this activity");
         }
         Link(a, item, VORILinkableObject::ItemLink, via);
-      } else if (tag == "resource") {
+      } else if (IsTag(c, "resource")) {
         auto* r = Ref<VORProductImpl>(c, "ref", "a resource");
         if (!r->isResource)
           Fail(c, "'" + id + "': '" + r->id + "' is a product, not a resource");
         if (a->FindLink(r, VORILinkableObject::ResourceLink))
           Fail(c, "'" + id + "': resource '" + r->id + "' assigned twice");
         Link(a, r, VORILinkableObject::ResourceLink);
-      } else if (tag == "attribute") {
+      } else if (IsTag(c, "attribute")) {
         const std::string name = Required(c, "name");
         if (name.empty() || a->attributes.count(name))
           Fail(c, "'" + id + "': attribute '" + name + "' empty or given twice");
         a->attributes[name] = TypedValue(c, id);
-      } else if (tag == "flow") {
+      } else if (IsTag(c, "flow")) {
         flows.push_back(c);
       } else {
-        Fail(c, "unexpected element <" + tag + "> in activity '" + id + "'");
+        Fail(c, "unexpected element <" + Tag(c) + "> in activity '" + id + "'");
       }
     }
     for (DOMElement* f : flows) {
       const std::string from = Required(f, "from"), to = Required(f, "to");
-      auto* a1 = dynamic_cast<VORGraphNodeImpl*>(_data.Find(from));
-      auto* a2 = dynamic_cast<VORGraphNodeImpl*>(_data.Find(to));
+      auto* a1 = VORKindCast<VORGraphNodeImpl>(_data.Find(from));
+      auto* a2 = VORKindCast<VORGraphNodeImpl>(_data.Find(to));
       if (a1 == nullptr)
         Fail(f, "flow from '" + from + "', which is no activity of the document");
       if (a2 == nullptr)
@@ -552,7 +558,7 @@ class Writer {
       return;
     if (a->time != 0)
       SetDouble(e, "time", a->time);
-    if (dynamic_cast<VORStationImpl*>(a) != nullptr)
+    if (VORKindCast<VORStationImpl>(a) != nullptr)
       SetDouble(e, "cycleTime", a->stationCycleTime);
     for (auto& io : a->productIOs) {
       DOMElement* c = Element(e, io->input ? "input" : "output");
@@ -620,6 +626,7 @@ VORProcess* VORProcess::LoadFromString(const std::string& xml, const std::string
   if (!dom)
     return nullptr;
   auto doc = VORHandle<VORProcess>::Adopt(new VORProcess());
+  doc->_data->ids.reserve(xml.size() / 120);
   try {
     Loader loader(dom, name, *doc->_data);
     loader.Load();

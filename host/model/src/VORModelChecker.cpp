@@ -131,15 +131,14 @@ class Checker {
       outCount[l.target]++;
       const std::string what = l.type + " link '" + o->id + "' -> '" + l.target->id + "'";
       if (l.type == VORILinkableObject::ResourceLink) {
-        auto* r = dynamic_cast<VORProductImpl*>(l.target);
-        if (dynamic_cast<VORActivityImpl*>(o) == nullptr || r == nullptr || !r->isResource)
+        auto* r = VORKindCast<VORProductImpl>(l.target);
+        if (VORKindCast<VORActivityImpl>(o) == nullptr || r == nullptr || !r->isResource)
           Problem(what + " does not assign a resource to an activity");
       } else if (l.type == VORILinkableObject::ItemLink) {
-        if (dynamic_cast<VORActivityImpl*>(o) == nullptr ||
-            dynamic_cast<VORISPPItem*>(l.target) == nullptr)
+        if (VORKindCast<VORActivityImpl>(o) == nullptr || !l.target->Is(VORKindItem))
           Problem(what + " does not assign an item to an activity");
         if (l.via != nullptr &&
-            (_objects.count(l.via) == 0 || l.via->activity != dynamic_cast<VORActivityImpl*>(o)))
+            (_objects.count(l.via) == 0 || l.via->activity != VORKindCast<VORActivityImpl>(o)))
           Problem(what + " was made with an input that is not the activity's");
       }
     }

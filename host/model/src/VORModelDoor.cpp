@@ -158,7 +158,7 @@ struct Detached {
 
 void DetachEverything(const std::vector<VORModelObject*>& objects, Detached& d) {
   for (VORModelObject* o : objects) {
-    if (auto* io = dynamic_cast<VORProductIOImpl*>(o); io != nullptr && io->activity) {
+    if (auto* io = VORKindCast<VORProductIOImpl>(o); io != nullptr && io->activity) {
       // Assignments made through this input keep the item but lose the input.
       VORActivityImpl* a = io->activity;
       for (size_t i = 0; i < a->out.size(); ++i) {
@@ -181,7 +181,7 @@ void DetachEverything(const std::vector<VORModelObject*>& objects, Detached& d) 
       }
       d.links.push_back(DetachLink(source, static_cast<size_t>(idx)));
     }
-    if (auto* n = dynamic_cast<VORGraphNodeImpl*>(o)) {
+    if (auto* n = VORKindCast<VORGraphNodeImpl>(o)) {
       while (!n->next.empty())
         d.flows.push_back(DetachFlow(n, n->next.back().node));
       while (!n->previous.empty())
@@ -512,8 +512,7 @@ VORModelObject* ItemOf(VORBaseUnknown* object, VORDocumentData* data) {
   auto* o = VORImplOf<VORModelObject>(object, data);
   if (o == nullptr)
     return nullptr;
-  if (dynamic_cast<VORProductImpl*>(o) == nullptr &&
-      dynamic_cast<VORMfgAssemblyImpl*>(o) == nullptr)
+  if (VORKindCast<VORProductImpl>(o) == nullptr && VORKindCast<VORMfgAssemblyImpl>(o) == nullptr)
     return nullptr;
   return o;
 }
@@ -715,9 +714,9 @@ HRESULT VORModelDoor::RemoveProduct(VORBaseUnknown* productObject) {
   for (VORProductImpl* q : products) {
     std::vector<VORModelObject*> sources(q->in.begin(), q->in.end());
     for (VORModelObject* s : sources) {
-      if (auto* io = dynamic_cast<VORProductIOImpl*>(s); io && io->Item() == q) {
+      if (auto* io = VORKindCast<VORProductIOImpl>(s); io && io->Item() == q) {
         RemoveProductIO(Unk(io));
-      } else if (auto* a = dynamic_cast<VORActivityImpl*>(s)) {
+      } else if (auto* a = VORKindCast<VORActivityImpl>(s)) {
         if (a->FindLink(q, VORILinkableObject::ItemLink))
           UnassignItem(Unk(a), Unk(q));
         if (a->FindLink(q, VORILinkableObject::ResourceLink))
@@ -931,9 +930,9 @@ HRESULT VORModelDoor::DeleteMfgAssembly(VORBaseUnknown* assemblyObject) {
     return S_OK;  // a listener deleted it
   std::vector<VORModelObject*> sources(m->in.begin(), m->in.end());
   for (VORModelObject* s : sources) {
-    if (auto* io = dynamic_cast<VORProductIOImpl*>(s); io && io->Item() == m)
+    if (auto* io = VORKindCast<VORProductIOImpl>(s); io && io->Item() == m)
       RemoveProductIO(Unk(io));
-    else if (auto* a = dynamic_cast<VORActivityImpl*>(s);
+    else if (auto* a = VORKindCast<VORActivityImpl>(s);
              a && a->FindLink(m, VORILinkableObject::ItemLink))
       UnassignItem(Unk(a), Unk(m));
   }

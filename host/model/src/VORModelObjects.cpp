@@ -15,15 +15,15 @@ bool VORMatchesFilter(VORModelObject* object, const char* filter) {
     return true;
   const std::string f = filter;
   if (f == VORModelFilters::Activity)
-    return dynamic_cast<VORActivityImpl*>(object) != nullptr;
+    return VORKindCast<VORActivityImpl>(object) != nullptr;
   if (f == VORModelFilters::Item)
-    return dynamic_cast<VORISPPItem*>(object) != nullptr;
+    return object->Is(VORKindItem);
   if (f == VORModelFilters::Resource) {
-    auto* p = dynamic_cast<VORProductImpl*>(object);
+    auto* p = VORKindCast<VORProductImpl>(object);
     return p != nullptr && p->isResource;
   }
   if (f == VORModelFilters::Product)
-    return dynamic_cast<VORProductImpl*>(object) != nullptr;
+    return VORKindCast<VORProductImpl>(object) != nullptr;
   return VORLateTypes::IsKindOf(object->lateType, f);
 }
 

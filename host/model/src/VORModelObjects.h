@@ -28,12 +28,32 @@ struct VORModelLink {
   VORProductIOImpl* via = nullptr;
 };
 
+// Kind bits of the implementation classes: a cheap exact cast in the hot loops (a
+// dynamic_cast across shared libraries compares type names).
+enum VORObjectKind : unsigned {
+  VORKindRoot = 1,
+  VORKindStation = 2,
+  VORKindGrouping = 4,
+  VORKindOtherActivity = 8,
+  VORKindControlNode = 16,
+  VORKindProductIO = 32,
+  VORKindProduct = 64,
+  VORKindAssembly = 128,
+  VORKindPlanType = 256,
+  VORKindActivity = 1 | 2 | 4 | 8,
+  VORKindGraphNode = VORKindActivity | 16,
+  VORKindItem = VORKindProduct | VORKindAssembly,
+  VORKindAll = 511,
+};
+
 class VORModelObject : public virtual VORIModelEvents,
                        public virtual VORISpecObject,
                        public virtual VORILinkableObject {
   VOR_DECLARE_CLASS(VORModelObject, VORBaseUnknown)
  public:
-  VORModelObject(std::string lateType) : lateType(std::move(lateType)) {}
+  static constexpr unsigned KindMask = VORKindAll;
+  VORModelObject(std::string lateType, unsigned kind) : lateType(std::move(lateType)), kind(kind) {}
+  bool Is(unsigned mask) const { return (kind & mask) != 0; }
 
   const char* GetLateType() const override { return lateType.c_str(); }
 
@@ -57,6 +77,7 @@ class VORModelObject : public virtual VORIModelEvents,
 
   std::string id;
   std::string lateType;
+  unsigned kind;
   VORDocumentData* data = nullptr;
   std::vector<VORModelLink> out;
   std::vector<VORModelObject*> in;  // one entry per incoming link (sources)
@@ -80,6 +101,7 @@ class VORGraphNodeImpl : public VORModelObject,
                          public virtual VORISPPFlowMgt {
   VOR_DECLARE_CLASS(VORGraphNodeImpl, VORModelObject)
  public:
+  static constexpr unsigned KindMask = VORKindGraphNode;
   using VORModelObject::VORModelObject;
 
   // VORIGENode
@@ -127,7 +149,8 @@ class VORGraphNodeImpl : public VORModelObject,
 class VORControlNodeImpl : public VORGraphNodeImpl {
   VOR_DECLARE_CLASS(VORControlNodeImpl, VORGraphNodeImpl)
  public:
-  using VORGraphNodeImpl::VORGraphNodeImpl;
+  static constexpr unsigned KindMask = VORKindControlNode;
+  explicit VORControlNodeImpl(std::string type) : VORGraphNodeImpl(std::move(type), KindMask) {}
 
  protected:
   ~VORControlNodeImpl() override = default;
@@ -142,7 +165,9 @@ class VORActivityImpl : public VORGraphNodeImpl,
                         public virtual VORIUserAttributes {
   VOR_DECLARE_CLASS(VORActivityImpl, VORGraphNodeImpl)
  public:
-  using VORGraphNodeImpl::VORGraphNodeImpl;
+  static constexpr unsigned KindMask = VORKindActivity;
+  explicit VORActivityImpl(std::string type, unsigned kind = VORKindOtherActivity)
+      : VORGraphNodeImpl(std::move(type), kind) {}
 
   // VORISPPActivity / VORISPPAbstractActivity
   HRESULT GetName(VORUnicodeString& name) override;
@@ -213,7 +238,8 @@ class VORStationImpl : public VORActivityImpl,
                        public VORBIWItemInfoImpl {
   VOR_DECLARE_CLASS(VORStationImpl, VORActivityImpl)
  public:
-  using VORActivityImpl::VORActivityImpl;
+  static constexpr unsigned KindMask = VORKindStation;
+  explicit VORStationImpl(std::string type) : VORActivityImpl(std::move(type), KindMask) {}
   HRESULT GetStationCycleTime(double& t) override;
   HRESULT SetStationCycleTime(double t) override;
 
@@ -224,7 +250,8 @@ class VORStationImpl : public VORActivityImpl,
 class VORGroupingImpl : public VORActivityImpl, public VORBIWItemInfoImpl {
   VOR_DECLARE_CLASS(VORGroupingImpl, VORActivityImpl)
  public:
-  using VORActivityImpl::VORActivityImpl;
+  static constexpr unsigned KindMask = VORKindGrouping;
+  explicit VORGroupingImpl(std::string type) : VORActivityImpl(std::move(type), KindMask) {}
 
  protected:
   ~VORGroupingImpl() override = default;
@@ -236,7 +263,8 @@ class VORRootImpl : public VORActivityImpl,
                     public virtual QELIUpdateManufAssly {
   VOR_DECLARE_CLASS(VORRootImpl, VORActivityImpl)
  public:
-  using VORActivityImpl::VORActivityImpl;
+  static constexpr unsigned KindMask = VORKindRoot;
+  explicit VORRootImpl(std::string type) : VORActivityImpl(std::move(type), KindMask) {}
   VOREventPublisher* GetEventPublisher() override { return VORModelObject::GetEventPublisher(); }
   VORProcess* GetProcessDocument() override { return GetDocument(); }
   bool IsUpdateInProgress() override { return updateInProgress; }
@@ -251,8 +279,10 @@ class VORRootImpl : public VORActivityImpl,
 class VORProductIOImpl : public VORModelObject, public virtual VORISPPProductIO {
   VOR_DECLARE_CLASS(VORProductIOImpl, VORModelObject)
  public:
-  VORProductIOImpl(bool input)
-      : VORModelObject(input ? VORModelLateTypes::ProductInput : VORModelLateTypes::ProductOutput),
+  static constexpr unsigned KindMask = VORKindProductIO;
+  explicit VORProductIOImpl(bool input)
+      : VORModelObject(input ? VORModelLateTypes::ProductInput : VORModelLateTypes::ProductOutput,
+                       KindMask),
         input(input) {}
   bool IsInput() override { return input; }
   HRESULT GetItem(VORBaseUnknown_var& item) override;
@@ -279,7 +309,8 @@ class VORProductImpl : public VORModelObject,
                        public virtual VORIResource {
   VOR_DECLARE_CLASS(VORProductImpl, VORModelObject)
  public:
-  VORProductImpl() : VORModelObject(VORModelLateTypes::Product) {}
+  static constexpr unsigned KindMask = VORKindProduct;
+  VORProductImpl() : VORModelObject(VORModelLateTypes::Product, KindMask) {}
   // Answers VORIResource only once it is a resource.
   HRESULT QueryInterface(const VORInterfaceId& iid, void** result) override;
 
@@ -322,7 +353,8 @@ class VORMfgAssemblyImpl : public VORModelObject,
                            public virtual VORISPPItem {
   VOR_DECLARE_CLASS(VORMfgAssemblyImpl, VORModelObject)
  public:
-  VORMfgAssemblyImpl() : VORModelObject(VORModelLateTypes::MfgAssembly) {}
+  static constexpr unsigned KindMask = VORKindAssembly;
+  VORMfgAssemblyImpl() : VORModelObject(VORModelLateTypes::MfgAssembly, KindMask) {}
   HRESULT GetComponents(VORListValVORBaseUnknown_var*& components) override;
   HRESULT AddComponent(VORBaseUnknown* component) override;
   HRESULT RemoveComponent(VORBaseUnknown* component) override;
@@ -340,7 +372,8 @@ class VORMfgAssemblyImpl : public VORModelObject,
 class VORPlanTypeImpl : public VORModelObject {
   VOR_DECLARE_CLASS(VORPlanTypeImpl, VORModelObject)
  public:
-  VORPlanTypeImpl() : VORModelObject("PlanType") {}
+  static constexpr unsigned KindMask = VORKindPlanType;
+  VORPlanTypeImpl() : VORModelObject("PlanType", KindMask) {}
   static constexpr const char* BaseLink = "base";
   VORPlanTypeImpl* Base() const;
   // attribute (key, name) -> value; "name" under key "" is the plan type's name.
@@ -447,6 +480,12 @@ T* VORImplOf(VORBaseUnknown* object, VORDocumentData* data = nullptr) {
   if (data != nullptr && impl->data != data)
     return nullptr;
   return impl;
+}
+
+// The object as T when its kind is one of T's, else null.
+template <class T>
+T* VORKindCast(VORModelObject* object) {
+  return object != nullptr && object->Is(T::KindMask) ? static_cast<T*>(object) : nullptr;
 }
 
 // Helpers shared by the implementation files.

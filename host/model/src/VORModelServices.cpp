@@ -105,7 +105,7 @@ struct Copier {
     if (a == nullptr)
       return S_OK;
     door.SetActivityTime(created, a->time);
-    if (dynamic_cast<VORStationImpl*>(a))
+    if (VORKindCast<VORStationImpl>(a))
       door.SetStationCycleTime(created, a->stationCycleTime);
     for (auto& [name, value] : a->attributes)
       door.SetUserAttribute(created, VORUnicodeString(name), value);
@@ -281,7 +281,7 @@ HRESULT VORBIWItemInfoImpl::GetSecondItemList(VORListValVORBaseUnknown_var*& ite
 HRESULT VORBIWItemInfoImpl::GetActivityList(VORListValVORBaseUnknown_var*& activities) {
   activities = VORNewList();
   const auto children = ChildActivities(Self());
-  if (children.empty() && dynamic_cast<VORStationImpl*>(Self()))
+  if (children.empty() && VORKindCast<VORStationImpl>(Self()))
     activities->Append(VORBaseUnknown_var(Unk(Self())));
   for (VORActivityImpl* c : children)
     activities->Append(VORBaseUnknown_var(Unk(c)));

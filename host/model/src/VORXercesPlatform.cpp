@@ -258,6 +258,7 @@ Document ParseMemory(const std::string& content, const std::string& name, std::s
     c->setParameter(XMLUni::fgDOMElementContentWhitespace, false);
     c->setParameter(XMLUni::fgDOMErrorHandler, impl->errors.get());
     parser->setFilter(impl->filter.get());
+    impl->filter->offsets.reserve(content.size() / 64);
 
     MemBufInputSource source(reinterpret_cast<const XMLByte*>(content.data()), content.size(),
                              FromUTF8(name).c_str(), false, impl->memory.get());
@@ -300,10 +301,34 @@ Document ParseFile(const std::string& path, std::string& error, const ParseLimit
 }
 
 std::string ToUTF8(const XMLCh* text) {
+  std::string out;
   if (text == nullptr)
-    return {};
-  const std::u16string_view view(reinterpret_cast<const char16_t*>(text));
-  return VORUnicodeString::FromUTF16(view).ConvertToUTF8();
+    return out;
+  for (const XMLCh* p = text; *p != 0; ++p) {
+    char32_t c = static_cast<char16_t>(*p);
+    if (c >= 0xD800 && c < 0xDC00 && p[1] >= 0xDC00 && p[1] < 0xE000) {
+      c = 0x10000 + ((c - 0xD800) << 10) + (static_cast<char16_t>(p[1]) - 0xDC00);
+      ++p;
+    } else if (c >= 0xD800 && c < 0xE000) {
+      c = 0xFFFD;  // a lone surrogate
+    }
+    if (c < 0x80) {
+      out += static_cast<char>(c);
+    } else if (c < 0x800) {
+      out += static_cast<char>(0xC0 | (c >> 6));
+      out += static_cast<char>(0x80 | (c & 0x3F));
+    } else if (c < 0x10000) {
+      out += static_cast<char>(0xE0 | (c >> 12));
+      out += static_cast<char>(0x80 | ((c >> 6) & 0x3F));
+      out += static_cast<char>(0x80 | (c & 0x3F));
+    } else {
+      out += static_cast<char>(0xF0 | (c >> 18));
+      out += static_cast<char>(0x80 | ((c >> 12) & 0x3F));
+      out += static_cast<char>(0x80 | ((c >> 6) & 0x3F));
+      out += static_cast<char>(0x80 | (c & 0x3F));
+    }
+  }
+  return out;
 }
 
 std::u16string FromUTF8(const std::string& text) {
