@@ -119,3 +119,76 @@ TEST(ISOTest, HoldsEachModelOnceAndForgetsViewersOnRequest) {
   EXPECT_TRUE(iso->RemoveElement(model.get()));
   EXPECT_FALSE(iso->IsPresent(model.get()));
 }
+
+TEST(CSOTest, TheLeafIndexAnswersLikeAPlainScanOverManyRandomChanges) {
+  // Reference: the set's paths in order, compared by a linear scan.
+  auto cso = Make<VORCSO>();
+  std::vector<VORHandle<TestThing>> objects;
+  for (int i = 0; i < 12; ++i)
+    objects.push_back(Make<TestThing>());
+  std::vector<std::pair<VORBaseUnknown*, VORBaseUnknown*>> reference;  // (father, leaf)
+  auto referenceLocate = [&](VORBaseUnknown* father, VORBaseUnknown* leaf) {
+    for (size_t i = 0; i < reference.size(); ++i) {
+      if (reference[i].first == father && reference[i].second == leaf)
+        return static_cast<int>(i) + 1;
+    }
+    return 0;
+  };
+  unsigned state = 12345;
+  auto next = [&](unsigned n) {
+    state = state * 1103515245u + 12345u;
+    return (state >> 8) % n;
+  };
+  for (int step = 0; step < 3000; ++step) {
+    VORBaseUnknown* father = objects[next(3)].get();
+    VORBaseUnknown* leaf = objects[3 + next(9)].get();
+    VORListValVORBaseUnknown_var chain;
+    chain.Append(VORBaseUnknown_var(father));
+    chain.Append(VORBaseUnknown_var(leaf));
+    auto path = Make<VORPathElement>(chain);
+    switch (next(5)) {
+      case 0:
+      case 1: {
+        const bool added = cso->AddElement(path);
+        EXPECT_EQ(added, referenceLocate(father, leaf) == 0);
+        if (added)
+          reference.emplace_back(father, leaf);
+        break;
+      }
+      case 2: {
+        const bool removed = cso->RemoveElement(path);
+        const int at = referenceLocate(father, leaf);
+        EXPECT_EQ(removed, at != 0);
+        if (at != 0)
+          reference.erase(reference.begin() + (at - 1));
+        break;
+      }
+      case 3: {
+        bool any = false;
+        for (auto it = reference.begin(); it != reference.end();) {
+          if (it->second == leaf) {
+            it = reference.erase(it);
+            any = true;
+          } else {
+            ++it;
+          }
+        }
+        EXPECT_EQ(cso->RemoveElement(leaf), any);
+        break;
+      }
+      default:
+        if (next(20) == 0) {
+          cso->Empty();
+          reference.clear();
+        }
+    }
+    ASSERT_EQ(cso->Locate(path), referenceLocate(father, leaf)) << "step " << step;
+    int firstWithLeaf = 0;
+    for (size_t i = 0; i < reference.size() && firstWithLeaf == 0; ++i) {
+      if (reference[i].second == leaf)
+        firstWithLeaf = static_cast<int>(i) + 1;
+    }
+    ASSERT_EQ(cso->Locate(leaf), firstWithLeaf) << "step " << step;
+    ASSERT_EQ(cso->GetSize(), static_cast<int>(reference.size()));
+  }
+}

@@ -1,7 +1,10 @@
 // Ordered set of picked paths with change notifications: the base of the editor's CSO (current
 // selection), PSO (preselection) and HSO (highlight). Plain objects given to it are wrapped in a
 // one-element path. Each change dispatches one notification with the added and removed paths.
+// A path must not be changed while a set holds it (the set indexes paths by their leaf).
 #pragma once
+
+#include <unordered_map>
 
 #include "VOREventPublisher.h"
 #include "VORPathElement.h"
@@ -43,10 +46,16 @@ class VORSelectionSet : public VORBaseUnknown {
 
  private:
   int LocateEqual(const VORPathElement& path) const;
+  // True when a path equal to path is in the set (through the leaf index).
+  bool HasEqual(const VORPathElement& path) const;
+  void Index(VORPathElement* path);
+  void Unindex(VORPathElement* path);
   void Notify(const VORListValVORBaseUnknown_var& added,
               const VORListValVORBaseUnknown_var& removed);
 
   VORListValVORBaseUnknown_var _elements;  // VORPathElement objects
+  // Paths by leaf identity: duplicate checks and object look-ups without scanning the set.
+  std::unordered_multimap<VORBaseUnknown*, VORPathElement*> _byLeaf;
   int _cursor = 0;
   VORHandle<VOREventPublisher> _publisher;
 };

@@ -25,7 +25,32 @@ VORPathElement* VORSelectionSet::NextElement() {
   return GetElement(++_cursor);
 }
 
+void VORSelectionSet::Index(VORPathElement* path) {
+  _byLeaf.emplace(path->GetLeaf(), path);
+}
+
+void VORSelectionSet::Unindex(VORPathElement* path) {
+  auto [first, last] = _byLeaf.equal_range(path->GetLeaf());
+  for (auto it = first; it != last; ++it) {
+    if (it->second == path) {
+      _byLeaf.erase(it);
+      return;
+    }
+  }
+}
+
+bool VORSelectionSet::HasEqual(const VORPathElement& path) const {
+  auto [first, last] = _byLeaf.equal_range(path.GetLeaf());
+  for (auto it = first; it != last; ++it) {
+    if (it->second == &path || it->second->IsEqual(path))
+      return true;
+  }
+  return false;
+}
+
 int VORSelectionSet::LocateEqual(const VORPathElement& path) const {
+  if (!HasEqual(path))
+    return 0;
   for (int i = 1; i <= _elements.Size(); ++i) {
     if (GetElement(i) == &path || GetElement(i)->IsEqual(path))
       return i;
@@ -43,9 +68,10 @@ int VORSelectionSet::AddElements(const VORListValVORBaseUnknown_var& pathsOrObje
   VORListValVORBaseUnknown_var added;
   for (const VORBaseUnknown_var& e : pathsOrObjects) {
     VORPathElement_var path = VORMakePath(e);
-    if (!path || path->GetSize() == 0 || LocateEqual(*path) != 0)
+    if (!path || path->GetSize() == 0 || HasEqual(*path))
       continue;
     _elements.Append(VORBaseUnknown_var(path.get()));
+    Index(path);
     added.Append(VORBaseUnknown_var(path.get()));
   }
   if (!added.IsEmpty())
@@ -58,11 +84,14 @@ bool VORSelectionSet::RemoveElement(VORBaseUnknown* pathOrObject) {
     return false;
   VORListValVORBaseUnknown_var removed;
   auto* path = dynamic_cast<VORPathElement*>(pathOrObject);
+  if (path ? !HasEqual(*path) : _byLeaf.count(pathOrObject->GetIdentity()) == 0)
+    return false;
   for (int i = _elements.Size(); i >= 1; --i) {
     VORPathElement* e = GetElement(i);
     const bool match =
         path ? (e == path || e->IsEqual(*path)) : e->GetLeaf() == pathOrObject->GetIdentity();
     if (match) {
+      Unindex(e);
       removed.InsertAt(1, _elements[i]);
       _elements.RemovePosition(i);
     }
@@ -79,6 +108,7 @@ void VORSelectionSet::Empty() {
   VORListValVORBaseUnknown_var removed;
   removed.Append(_elements);
   _elements.RemoveAll();
+  _byLeaf.clear();
   Notify(VORListValVORBaseUnknown_var(), removed);
 }
 
@@ -87,6 +117,8 @@ int VORSelectionSet::Locate(VORBaseUnknown* pathOrObject) const {
     return 0;
   if (auto* path = dynamic_cast<VORPathElement*>(pathOrObject))
     return LocateEqual(*path);
+  if (_byLeaf.find(pathOrObject->GetIdentity()) == _byLeaf.end())
+    return 0;
   for (int i = 1; i <= _elements.Size(); ++i) {
     if (GetElement(i)->GetLeaf() == pathOrObject->GetIdentity())
       return i;
