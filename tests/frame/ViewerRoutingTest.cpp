@@ -7,6 +7,7 @@
 #include "VOR2DPolygonRep.h"
 #include "VORDlgContextualMenu.h"
 #include "VORDriver.h"
+#include "VORFileIO.h"
 #include "VORFrmWindowKinds.h"
 #include "VORManipulator.h"
 #include "VORViewer.h"
@@ -77,4 +78,15 @@ TEST_F(ViewerRoutingTest, ADragMovesTheManipulatorThroughTheViewer) {
   EXPECT_EQ(ends, 1);
   EXPECT_FALSE(driver.Drag("Chart", 300, 300, 310, 300));
   manipulator->RemoveAllElements();
+}
+
+TEST_F(ViewerRoutingTest, AScriptExportsTheViewerSceneAsSVG) {
+  const std::string svg = dir.Path() + "/chart.svg";
+  ASSERT_TRUE(driver.ExportWindow("Chart", svg)) << driver.LastError();
+  std::string text, error;
+  ASSERT_TRUE(VORReadFile(svg, text, error)) << error;
+  EXPECT_NE(text.find("<svg"), std::string::npos);
+  EXPECT_NE(text.find("<polygon"), std::string::npos) << text;
+  EXPECT_FALSE(driver.ExportWindow("line.pprx", svg));
+  EXPECT_EQ(driver.LastError(), "\"line.pprx\" has no viewer to export");
 }

@@ -7,6 +7,7 @@
 #include "VORCSO.h"
 #include "VORCommandEngine.h"
 #include "VORDeferredDeletion.h"
+#include "VORHSO.h"
 #include "VORPathElementAgent.h"
 #include "VORSelectionContext.h"
 #include "VORStateCommand.h"
@@ -83,7 +84,7 @@ class PickCommand : public VORStateCommand {
 class StateCommandTest : public ::testing::Test {
  protected:
   void SetUp() override {
-    VORSelectionContext::Set(cso, nullptr, nullptr, nullptr);
+    VORSelectionContext::Set(cso, nullptr, hso, nullptr);
     _ends = VORCommandEngine::GetEventPublisher()->AddCallback(
         "VORCommandEndNotification",
         [this](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
@@ -111,6 +112,7 @@ class StateCommandTest : public ::testing::Test {
   }
 
   VORCSO_var cso = Make<VORCSO>();
+  VORHSO_var hso = Make<VORHSO>();
   VORCommand_var dialog = Make<VORCommand>(nullptr, "dialog");
   std::vector<std::string> log;
   std::vector<std::string> ends;
@@ -148,6 +150,10 @@ TEST_F(StateCommandTest, RepeatedPicksJoinOneSelectionAndARepickMovesToTheEnd) {
   EXPECT_EQ(cso->GetElement(1)->GetLeaf(), s2.get());
   EXPECT_EQ(cso->GetElement(2)->GetLeaf(), s1.get());
   EXPECT_EQ(command->GetCurrentState()->GetName().str(), "More");
+  EXPECT_EQ(hso->GetSize(), 2) << "picks are highlighted";
+  command->Cancel(nullptr, nullptr);
+  EXPECT_TRUE(hso->IsEmpty()) << "the highlight ends with the command";
+  EXPECT_EQ(cso->GetSize(), 2) << "the selection stays";
 }
 
 TEST_F(StateCommandTest, OKRunsTheActionAndEndsCancelEndsWithoutItAndTheCommandIsReleased) {

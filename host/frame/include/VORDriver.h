@@ -28,6 +28,8 @@ class VORDriver {
   VORFrmEditor* GetEditor() const;
   VORProcess* GetDocument() const;
   bool SaveDocument(const std::string& path);
+  // Writes the window's viewer scene as SVG (empty window: the current one).
+  bool ExportWindow(const std::string& window, const std::string& path);
 
   // Commands: a workbench command id or a declared host command id.
   bool StartCommand(const std::string& id);

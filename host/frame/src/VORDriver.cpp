@@ -14,6 +14,7 @@
 #include "VORIGENode.h"
 #include "VORIGraphNodeLayout.h"
 #include "VORIProduct.h"
+#include "VORSVGWriter.h"
 #include "VORStateCommand.h"
 #include "VORWorkbench.h"
 
@@ -156,6 +157,19 @@ bool VORDriver::SaveDocument(const std::string& path) {
     return Fail("no document is open");
   std::string error;
   if (!document->SaveAs(path, error))
+    return Fail(error);
+  return Step(true);
+}
+
+bool VORDriver::ExportWindow(const std::string& window, const std::string& path) {
+  VORFrmWindow* w = FindWindow(window);
+  if (w == nullptr)
+    return Fail("no window \"" + window + "\"");
+  VORViewer* viewer = w->GetViewer();
+  if (viewer == nullptr)
+    return Fail("\"" + w->GetTitle().ConvertToUTF8() + "\" has no viewer to export");
+  std::string error;
+  if (!VORSVGWriter::WriteFile(*viewer, path, error))
     return Fail(error);
   return Step(true);
 }

@@ -145,6 +145,13 @@ bool VORScript::Execute(const std::vector<std::string>& w, std::string& error) {
     return args(1, 1, "open <document>") && driverStep(_driver.OpenDocument(w[1]));
   if (step == "save")
     return args(1, 1, "save <file>") && driverStep(_driver.SaveDocument(w[1]));
+  if (step == "export") {
+    if (!(n == 1 || (n == 3 && w[2] == "in"))) {
+      error = "usage: export <file.svg> [in <window>]";
+      return false;
+    }
+    return driverStep(_driver.ExportWindow(n == 3 ? w[3] : std::string(), w[1]));
+  }
   if (step == "workbench") {
     if (!args(1, 1, "workbench <file>"))
       return false;

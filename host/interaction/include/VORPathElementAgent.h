@@ -1,6 +1,7 @@
 // Agent that takes picked objects of one element type (an interface): single pick, or repeated
-// picks collected into one selection. Accepted picks update the current CSO. As a CSO client it
-// takes what is already selected when its command starts.
+// picks collected into one selection. Accepted picks update the current CSO and highlight (HSO);
+// the highlight is emptied when the command ends. As a CSO client the agent takes what is
+// already selected when its command starts.
 #pragma once
 
 #include "VORDialogAgent.h"

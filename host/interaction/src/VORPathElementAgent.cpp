@@ -1,6 +1,7 @@
 #include "VORPathElementAgent.h"
 
 #include "VORCSO.h"
+#include "VORHSO.h"
 #include "VORSelectionContext.h"
 
 VORPathElementAgent::VORPathElementAgent(const VORString& name) : VORDialogAgent(name) {}
@@ -60,16 +61,22 @@ bool VORPathElementAgent::Try(VORPathElement* path, bool updateCSO) {
     SetValue(previousValue);
     return false;
   }
-  if (VORCSO* cso = GetCSO(); cso != nullptr && updateCSO) {
-    if (!IsRepeated()) {
-      if (!(cso->GetSize() == 1 && cso->IsPresent(path))) {
-        cso->Empty();
-        cso->AddElement(path);
+  if (updateCSO) {
+    // The CSO takes the pick and the highlight shows it.
+    for (VORSelectionSet* set : {static_cast<VORSelectionSet*>(GetCSO()),
+                                 static_cast<VORSelectionSet*>(VORSelectionContext::HSO())}) {
+      if (set == nullptr)
+        continue;
+      if (!IsRepeated()) {
+        if (!(set->GetSize() == 1 && set->IsPresent(path))) {
+          set->Empty();
+          set->AddElement(path);
+        }
+      } else {
+        // A path picked again moves to the end, so that the last element is the last pick.
+        set->RemoveElement(path);
+        set->AddElement(path);
       }
-    } else {
-      // A path picked again moves to the end, so that the CSO's last element is the last pick.
-      cso->RemoveElement(path);
-      cso->AddElement(path);
     }
   }
   return true;

@@ -1,6 +1,8 @@
 #include "VORStateCommand.h"
 
 #include "VORCommandEngine.h"
+#include "VORHSO.h"
+#include "VORSelectionContext.h"
 #include "VORPathElementAgent.h"
 
 namespace {
@@ -177,6 +179,9 @@ void VORStateCommand::Evaluate() {
 
 void VORStateCommand::End(bool cancelled) {
   VORStateCommand_var keep(this);
+  // What the command's picks highlighted goes with it.
+  if (VORHSO* hso = VORSelectionContext::HSO())
+    hso->Empty();
   _running = false;
   _ended = true;
   _current = nullptr;
