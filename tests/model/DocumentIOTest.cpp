@@ -10,6 +10,7 @@
 #include <chrono>
 #include <csignal>
 #include <cstdlib>
+#include <set>
 
 #include "VORModelGenerator.h"
 
@@ -256,4 +257,64 @@ TEST(SaveTest, FailedSaveLeavesThePreviousFileAndSavedOnesKeepABackup) {
   EXPECT_NE(error.find("no/such/dir"), std::string::npos);
   VORProcess_var fresh = VORProcess_var::Adopt(VORProcess::CreateNew());
   EXPECT_FALSE(fresh->Save(error)) << "no file name yet";
+}
+
+// The bundled line looks like a real underbody line: sub-lines merge, stations load and join,
+// one grouping with Start and Stop, every kind of resource.
+TEST(SampleTest, TheUnderbodySampleHasTheShapeOfARealLine) {
+  std::string error;
+  VORProcess_var doc =
+      VORProcess_var::Adopt(VORProcess::Load(Examples() + "/underbody.pprx", error));
+  ASSERT_TRUE(doc) << error;
+  VORListValVORBaseUnknown_var* top = nullptr;
+  VORISPPChildManagement_var(doc->GetRootProcess())->GetChildren(top, "Activity");
+  int stations = 0, merges = 0, groupings = 0;
+  for (const VORBaseUnknown_var& a : *top) {
+    VORListValVORBaseUnknown_var* list = nullptr;
+    VORISPPFlowMgt_var(a)->GetPreviousActivities(list, "Activity");
+    merges += list->Size() >= 2;
+    delete list;
+    const std::string type = VORISPPActivity_var(a)->GetActivityType().str();
+    VORISPPChildManagement_var children(a);
+    if (type == "BIWActivityStation") {
+      ++stations;
+      children->GetChildren(list, "BIWActivityLoading");
+      EXPECT_EQ(list->Size(), 1);
+      delete list;
+      children->GetChildren(list, "PhysicalActivity");
+      EXPECT_GE(list->Size(), 2) << "loading and at least one joining";
+      delete list;
+    } else if (type == "BIWActivityGrouping") {
+      ++groupings;
+      children->GetChildren(list, "Start");
+      EXPECT_EQ(list->Size(), 1);
+      delete list;
+      children->GetChildren(list, "Stop");
+      EXPECT_EQ(list->Size(), 1);
+      delete list;
+    }
+  }
+  delete top;
+  EXPECT_GE(stations, 25);
+  EXPECT_GE(merges, 1);
+  EXPECT_EQ(groupings, 1);
+  std::set<std::string> classes;
+  std::vector<VORBaseUnknown_var> stack{doc->GetResourceRoot()};
+  while (!stack.empty()) {
+    VORBaseUnknown_var p = stack.back();
+    stack.pop_back();
+    if (VORIResource_var r{p}) {
+      VORUnicodeString cls;
+      r->GetResourceClass(cls);
+      classes.insert(Utf8(cls));
+    }
+    VORListValVORBaseUnknown_var* children = nullptr;
+    VORIProduct_var(p)->GetChildren(children);
+    for (const VORBaseUnknown_var& c : *children)
+      stack.push_back(c);
+    delete children;
+  }
+  for (const char* cls :
+       {"Station", "Robot", "WeldGun", "Fixture", "Worker", "Transport", "Buffer"})
+    EXPECT_EQ(classes.count(cls), 1u) << cls;
 }

@@ -16,7 +16,8 @@
 class VORProcess;
 class VORModelDoor;
 
-// Inverses of the changes made while it was attached, in order.
+// Inverses of the changes made while it was attached, in order. A log belongs to one document
+// and must not be replayed after that document is gone.
 class VORChangeLog {
  public:
   int Size() const { return static_cast<int>(_inverses.size()); }
