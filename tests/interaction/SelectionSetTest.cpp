@@ -85,8 +85,10 @@ TEST(CSOTest, EveryChangeSendsOneNotificationWithTheAddedAndRemovedPathsInOrder)
   EXPECT_FALSE(cso->RemoveElement(a.get()));
   cso->Empty();
   cso->Empty();  // already empty: silent
+  cso->AddElement(a.get());
+  cso->Empty(0);  // asked to be silent
 
-  EXPECT_EQ(recorder.log, (std::vector<std::string>{"+a", "+b", "-a", "-b"}));
+  EXPECT_EQ(recorder.log, (std::vector<std::string>{"+a", "+b", "-a", "-b", "+a"}));
   EXPECT_TRUE(cso->IsEmpty());
 }
 

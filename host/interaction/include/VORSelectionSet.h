@@ -29,7 +29,8 @@ class VORSelectionSet : public VORBaseUnknown {
   int AddElements(const VORListValVORBaseUnknown_var& pathsOrObjects);
   // Removes the path (identity), or for a plain object every path whose leaf is that object.
   bool RemoveElement(VORBaseUnknown* pathOrObject);
-  void Empty();
+  // notify 0 empties without a notification (a set being torn down).
+  void Empty(int notify = 1);
   // Position (1-based) of the path, or of the first path whose leaf is the object; 0 if absent.
   int Locate(VORBaseUnknown* pathOrObject) const;
   bool IsPresent(VORBaseUnknown* pathOrObject) const { return Locate(pathOrObject) != 0; }

@@ -102,14 +102,15 @@ bool VORSelectionSet::RemoveElement(VORBaseUnknown* pathOrObject) {
   return true;
 }
 
-void VORSelectionSet::Empty() {
+void VORSelectionSet::Empty(int notify) {
   if (_elements.IsEmpty())
     return;
   VORListValVORBaseUnknown_var removed;
   removed.Append(_elements);
   _elements.RemoveAll();
   _byLeaf.clear();
-  Notify(VORListValVORBaseUnknown_var(), removed);
+  if (notify != 0)
+    Notify(VORListValVORBaseUnknown_var(), removed);
 }
 
 int VORSelectionSet::Locate(VORBaseUnknown* pathOrObject) const {
