@@ -1,0 +1,429 @@
+#include "QELPFVNodeOrganiser.h"
+
+#include <algorithm>
+#include <unordered_map>
+#include <unordered_set>
+
+#include "QELIPertNode.h"
+#include "QELIPertNodeExt.h"
+#include "QELIPertPosition.h"
+#include "QELPFVLayoutCore.h"
+#include "QELPertClientVisuServices.h"
+#include "QELPertNotifications.h"
+#include "VORApplicationFrame.h"
+#include "VORDlgNotify.h"
+#include "VORDlgStyles.h"
+#include "VOREnv.h"
+#include "VORIGENode.h"
+#include "VORIModelEvents.h"
+#include "VORISPPActivity.h"
+#include "VORISPPFlowMgt.h"
+#include "VORMsgCatalog.h"
+#include "VORTrace.h"
+
+namespace {
+
+const VORTrace& Trace() {
+  static const VORTrace trace("QELProductFlowViewerTrace", 0, "STDERR", 1024);
+  return trace;
+}
+
+constexpr const char* kCatalog = "QELFpaProductFlowViewer";
+
+}  // namespace
+
+QELPFVNodeOrganiser::QELPFVNodeOrganiser()
+    : VORCommand(nullptr, VORString()),
+      _levelList(new VORRawCollint),
+      _visitedList(new VORRawCollint),
+      _levelLists(new VORListPtrVORListValVORBaseUnknown_var) {
+  Trace().TraPrint("QELPFVNodeOrganiser::Constructor -->");
+}
+
+QELPFVNodeOrganiser::~QELPFVNodeOrganiser() {
+  Trace().TraPrint("QELPFVNodeOrganiser::Destructor -->");
+  _cyclic = 0;
+  delete _childNodeList;
+  delete _levelList;
+  delete _visitedList;
+  for (VORListValVORBaseUnknown_var* list : *_levelLists) {
+    list->RemoveAll();
+    delete list;
+  }
+  _levelLists->RemoveAll();
+  delete _levelLists;
+  _controller = nullptr;
+}
+
+void QELPFVNodeOrganiser::InitialisePosList(int count) {
+  Trace().TraPrint("QELPFVNodeOrganiser::InitialisePosList -->");
+  for (int i = 0; i < count; ++i) {
+    _levelList->Append(0);
+    _visitedList->Append(0);
+  }
+}
+
+void QELPFVNodeOrganiser::GenerateNodeIndexes() {
+  Trace().TraPrint("QELPFVNodeOrganiser::GenerateNodeIndexes -->");
+  if (_childNodeList == nullptr || _childNodeList->Size() != _levelList->Size())
+    return;
+  const int n = _childNodeList->Size();
+  // Index of each child (its first occurrence), by object identity.
+  std::unordered_map<VORBaseUnknown*, int> index;
+  index.reserve(static_cast<size_t>(n));
+  for (int i = 1; i <= n; ++i)
+    index.emplace((*_childNodeList)[i].Identity(), i - 1);
+  _successors.assign(static_cast<size_t>(n), {});
+  for (int i = 1; i <= n; ++i) {
+    VORISPPFlowMgt_var flows((*_childNodeList)[i]);
+    VORListValVORBaseUnknown_var* next = nullptr;
+    if (!flows || FAILED(flows->GetNextActivities(next, "Activity")) || next == nullptr) {
+      delete next;
+      continue;
+    }
+    std::vector<int>& succ = _successors[static_cast<size_t>(i - 1)];
+    succ.reserve(static_cast<size_t>(next->Size()));
+    for (const VORBaseUnknown_var& s : *next) {
+      auto it = index.find(s.Identity());
+      if (it != index.end())
+        succ.push_back(it->second);
+    }
+    delete next;
+  }
+  // The walk itself (raising successors, reporting nodes met again) runs on the indexes.
+  const QELPFVLayoutCore::Levels levels = QELPFVLayoutCore::ComputeLevels(_successors);
+  for (int i = 1; i <= n; ++i)
+    (*_levelList)[i] = levels.level[static_cast<size_t>(i - 1)];
+  if (levels.cyclic) {
+    _cyclic = 1;
+    VORISPPActivity_var activity((*_childNodeList)[levels.cyclicIndex + 1]);
+    if (activity)
+      activity->GetName(_cyclicActivityName);
+  }
+}
+
+void QELPFVNodeOrganiser::ArrangeActAsPerLevel() {
+  Trace().TraPrint("QELPFVNodeOrganiser::ArrangeActAsPerLevel -->");
+  const int n = _levelList->Size();
+  if (_childNodeList == nullptr || n == 0 || _childNodeList->Size() != n)
+    return;
+  std::vector<int> level(static_cast<size_t>(n));
+  for (int i = 1; i <= n; ++i)
+    level[static_cast<size_t>(i - 1)] = (*_levelList)[i];
+  // The exchange sort's permutation, applied to both lists.
+  _order = QELPFVLayoutCore::ExchangeSortOrder(level);
+  VORListValVORBaseUnknown_var sorted;
+  sorted.Reserve(n);
+  for (int p = 0; p < n; ++p) {
+    const int from = _order[static_cast<size_t>(p)];
+    sorted.Append((*_childNodeList)[from + 1]);
+    (*_levelList)[p + 1] = level[static_cast<size_t>(from)];
+  }
+  std::swap(*_childNodeList, sorted);
+}
+
+void QELPFVNodeOrganiser::CreateListOfLists() {
+  Trace().TraPrint("QELPFVNodeOrganiser::CreateListOfLists -->");
+  const int n = _levelList->Size();
+  if (_childNodeList == nullptr || n == 0)
+    return;
+  const int highest = (*_levelList)[n];
+  int p = 1;
+  for (int v = 0; v <= highest; ++v) {
+    auto* list = new VORListValVORBaseUnknown_var;
+    while (p <= n && (*_levelList)[p] == v)
+      list->Append((*_childNodeList)[p++]);
+    _levelLists->Append(list);
+  }
+}
+
+void QELPFVNodeOrganiser::ArrangeNextActsWithRespectToCurrActs() {
+  Trace().TraPrint("QELPFVNodeOrganiser::ArrangeNextActsWithRespectToCurrActs -->");
+  if (_levelLists->Size() < 2 || _order.empty())
+    return;
+  // Original (child-order) levels for the index computation.
+  std::vector<int> level(_order.size());
+  for (size_t p = 0; p < _order.size(); ++p)
+    level[static_cast<size_t>(_order[p])] = (*_levelList)[static_cast<int>(p) + 1];
+  const std::vector<std::vector<int>> lists =
+      QELPFVLayoutCore::LevelLists(_successors, level, _order);
+  // Handles by original index: the sorted child list holds child order[p] at p + 1.
+  std::vector<const VORBaseUnknown_var*> byIndex(_order.size());
+  for (size_t p = 0; p < _order.size(); ++p)
+    byIndex[static_cast<size_t>(_order[p])] = &(*_childNodeList)[static_cast<int>(p) + 1];
+  for (int k = 2; k <= _levelLists->Size(); ++k) {
+    VORListValVORBaseUnknown_var* list = (*_levelLists)[k];
+    list->RemoveAll();
+    for (int node : lists[static_cast<size_t>(k - 1)])
+      list->Append(*byIndex[static_cast<size_t>(node)]);
+  }
+}
+
+void QELPFVNodeOrganiser::GetViewerOrSuperNodeSize(float* width, float* height) {
+  const int n = _levelList->Size();
+  if (n == 0)
+    return;
+  // The level list is sorted: the last entry is the highest level, equal levels are adjacent.
+  const int highest = (*_levelList)[n];
+  int widest = 0;
+  for (int p = 1, run = 0; p <= n; ++p) {
+    run = (p > 1 && (*_levelList)[p] == (*_levelList)[p - 1]) ? run + 1 : 1;
+    widest = std::max(widest, run);
+  }
+  *width = static_cast<float>(highest * 50);
+  *height = static_cast<float>(widest * 50);
+  if (*width >= *height)
+    *height = *width;
+  else
+    *width = *height;
+}
+
+bool QELPFVNodeOrganiser::ComputeLevels(VORBaseUnknown_var& root) {
+  VORIGENode_var rootNode(root);
+  if (!rootNode)
+    return false;
+  VORListValVORBaseUnknown_var* children = nullptr;
+  if (FAILED(rootNode->GetChildren(children)) || children == nullptr || children->Size() == 0) {
+    delete children;
+    return false;
+  }
+  delete _childNodeList;
+  _childNodeList = children;
+  InitialisePosList(_childNodeList->Size());
+  GenerateNodeIndexes();
+  if (_cyclic != 0) {
+    DisplayCyclicWarningDialog();
+    return false;
+  }
+  ArrangeActAsPerLevel();
+  CreateListOfLists();
+  ArrangeNextActsWithRespectToCurrActs();
+  return true;
+}
+
+void QELPFVNodeOrganiser::SetNodePosition(VORBaseUnknown_var& node, double x, double y) {
+  QELIPertNode_var pertNode(node);
+  pertNode->SetPosition(x, y, 1);
+  if (QELIPertNodeExt_var ext(node); ext)
+    ext->SetPosition(x, y, 1);
+}
+
+bool QELPFVNodeOrganiser::ArrangeNodes(VORBaseUnknown_var root, QELPertController* controller) {
+  Trace().TraPrint("QELPFVNodeOrganiser::ArrangeNodes -->");
+  if (!root || controller == nullptr)
+    return false;
+  if (!ComputeLevels(root))
+    return true;
+  _controller = controller;
+  if (_controller->GetViewer() == nullptr)
+    return false;
+
+  float width = 300.0f;
+  float height = 200.0f;
+  GetViewerOrSuperNodeSize(&width, &height);
+  const float side = width;
+  const int highest = (*_levelList)[_levelList->Size()];
+  const float xStep = highest > 0 ? side / static_cast<float>(highest) : 0.0f;
+  double x = 0.0;
+  double y = 0.0;
+  // Inside an expanded super node (whose reference object is the chart root, not itself) the
+  // columns start at the super node's own position.
+  QELIPertPosition_var position(root);
+  VORBaseUnknown_var reference;
+  if (!position || FAILED(position->GetReferenceObject(reference)) || reference != root) {
+    if (QELIPertNode_var rootPert(root); rootPert)
+      rootPert->GetPosition(x, y, 1);
+  }
+  const QELIPertNode_var noNode;
+  for (VORListValVORBaseUnknown_var* list : *_levelLists) {
+    const int count = list->Size();
+    float yStep = 0.0f;
+    if (count > 0) {
+      yStep = side / static_cast<float>(count);
+      y = side / static_cast<float>(2 * count);
+    }
+    for (VORBaseUnknown_var& node : *list) {
+      if (!QELIPertNode_var(node))
+        continue;
+      QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 1, noNode);
+      SetNodePosition(node, x, y);
+      y += yStep;
+      DispatchNotif(node);
+    }
+    x += xStep;
+  }
+  _controller->GetViewer()->Reframe();
+  return true;
+}
+
+void QELPFVNodeOrganiser::GetActListForPosChange(VORBaseUnknown_var& node,
+                                                 VORListValVORBaseUnknown_var*& ioList) {
+  if (!node || ioList == nullptr)
+    return;
+  // The recursion "append node; append all its successors; recurse into each" with an explicit
+  // stack, so that long chains do not exhaust the call stack.
+  struct Frame {
+    VORListValVORBaseUnknown_var* next;
+    int position;
+  };
+  auto successorsOf = [](const VORBaseUnknown_var& n) -> VORListValVORBaseUnknown_var* {
+    VORISPPFlowMgt_var flows(n);
+    VORListValVORBaseUnknown_var* next = nullptr;
+    if (!flows || FAILED(flows->GetNextActivities(next, "Activity")) || next == nullptr ||
+        next->Size() == 0) {
+      delete next;
+      return nullptr;
+    }
+    return next;
+  };
+  std::vector<Frame> stack;
+  ioList->Append(node);
+  if (auto* next = successorsOf(node)) {
+    ioList->Append(*next);
+    stack.push_back(Frame{next, 1});
+  }
+  while (!stack.empty()) {
+    Frame& top = stack.back();
+    if (top.position > top.next->Size()) {
+      delete top.next;
+      stack.pop_back();
+      continue;
+    }
+    const VORBaseUnknown_var current = (*top.next)[top.position++];
+    if (!current)
+      continue;
+    ioList->Append(current);
+    if (auto* next = successorsOf(current)) {
+      ioList->Append(*next);
+      stack.push_back(Frame{next, 1});  // invalidates top
+    }
+  }
+}
+
+bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
+                                          VORListValVORBaseUnknown_var*& newNodes,
+                                          QELPertController* controller) {
+  Trace().TraPrint("QELPFVNodeOrganiser::PositionNewNode -->");
+  if (!root || controller == nullptr)
+    return false;
+  if (!ComputeLevels(root))
+    return true;
+  _controller = controller;
+  if (_controller->GetViewer() == nullptr || newNodes == nullptr)
+    return false;
+  if (newNodes->Size() == 0)
+    return true;
+
+  const int n = _childNodeList->Size();
+  std::unordered_map<VORBaseUnknown*, int> sortedIndex;
+  sortedIndex.reserve(static_cast<size_t>(n));
+  for (int p = 1; p <= n; ++p)
+    sortedIndex.emplace((*_childNodeList)[p].Identity(), p);
+  const QELIPertNode_var noNode;
+  for (VORBaseUnknown_var& newNode : *newNodes) {
+    // What moves: the new node and everything downstream of it (the change list, as a set).
+    std::unordered_set<VORBaseUnknown*> change;
+    if (newNode) {
+      std::vector<VORBaseUnknown_var> pending{newNode};
+      change.insert(newNode.Identity());
+      while (!pending.empty()) {
+        VORBaseUnknown_var current = pending.back();
+        pending.pop_back();
+        VORISPPFlowMgt_var flows(current);
+        VORListValVORBaseUnknown_var* next = nullptr;
+        if (flows && SUCCEEDED(flows->GetNextActivities(next, "Activity")) && next != nullptr) {
+          for (const VORBaseUnknown_var& s : *next) {
+            if (change.insert(s.Identity()).second)
+              pending.push_back(s);
+          }
+        }
+        delete next;
+      }
+    }
+    float width = 300.0f;
+    float height = 200.0f;
+    GetViewerOrSuperNodeSize(&width, &height);
+    const float side = width;
+    const int highest = (*_levelList)[n];
+    const float xStep = highest > 0 ? side / static_cast<float>(highest) : 0.0f;
+    double x = 0.0;
+    double y = 0.0;
+    auto found = newNode ? sortedIndex.find(newNode.Identity()) : sortedIndex.end();
+    if (found != sortedIndex.end()) {
+      const int k0 = (*_levelList)[found->second] + 1;
+      if (k0 > 1) {
+        VORListValVORBaseUnknown_var* previous = (*_levelLists)[k0 - 1];
+        if (previous->Size() > 0) {
+          if (QELIPertNode_var first((*previous)[1]); first)
+            first->GetPosition(x, y, 1);
+        }
+      }
+      for (int k = k0; k <= _levelLists->Size(); ++k) {
+        VORListValVORBaseUnknown_var* list = (*_levelLists)[k];
+        const int count = list->Size();
+        float yStep = 0.0f;
+        if (count > 0) {
+          yStep = side / static_cast<float>(count);
+          y = side / static_cast<float>(2 * count);
+        }
+        x += xStep;
+        for (VORBaseUnknown_var& node : *list) {
+          if (!QELIPertNode_var(node))
+            continue;
+          QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 1, noNode);
+          if (change.count(node.Identity()) != 0) {
+            SetNodePosition(node, x, y);
+            DispatchNotif(node);
+          }
+          y += yStep;
+        }
+      }
+    }
+    _controller->GetViewer()->Reframe();
+  }
+  return true;
+}
+
+void QELPFVNodeOrganiser::DispatchNotif(VORBaseUnknown_var node) {
+  if (!node)
+    return;
+  double x = 0.0;
+  double y = 0.0;
+  if (QELIPertNode_var pertNode(node); pertNode)
+    pertNode->GetPosition(x, y, 1);
+  if (_controller != nullptr)
+    _controller->RefreshNodePositionInPert(node, true);
+  QELIPertPosition_var position(node);
+  if (!position)
+    return;
+  VORBaseUnknown_var reference;
+  position->GetReferenceObject(reference);
+  VORIModelEvents_var events(reference);
+  if (!events)
+    return;
+  auto notification =
+      VORHandle<QELPertPositionNotify>::Adopt(new QELPertPositionNotify(node, x, y));
+  events->Dispatch(notification);
+}
+
+void QELPFVNodeOrganiser::DisplayCyclicWarningDialog() {
+  Trace().TraPrint("QELPFVNodeOrganiser::DisplayCyclicWarningDialog -->");
+  VORApplicationFrame* frame = VORApplicationFrame::GetApplicationFrame();
+  if (frame == nullptr)
+    return;
+  if (VORFindResource(VORUnicodeString(kCatalog) + VORUnicodeString(".msg")).IsEmpty())
+    return;
+  VORDlgNotify* notify = nullptr;
+  if (VORGetEnv("ADL_ODT_OUT") == nullptr)
+    notify = new VORDlgNotify(frame->GetMainWindow(), "Warning", VORDlgNfyWarning | VORDlgNfyOK);
+  const VORUnicodeString title =
+      VORMsgCatalog::BuildMessage(kCatalog, "CyclicError.Title", "Cyclic Precedence");
+  VORUnicodeString message = VORMsgCatalog::BuildMessage(
+      kCatalog, "CyclicError.Message",
+      "The nodes cannot be laid out: the precedence flows are cyclic at the activity ");
+  message.Append(_cyclicActivityName);
+  if (notify != nullptr) {
+    notify->DisplayBlocked(message, title);
+    notify->RequestDelayedDestruction();
+  }
+}
