@@ -1,0 +1,66 @@
+// Base of the commands that fill and refresh a ZitBlt's list. The callback subscriber creates
+// one per ZitBlt that has an "UpdateData" element and hands it the views-change notifications
+// of its activity; the ZitBlt manager calls UpdateList for explicit refreshes. Derived commands
+// (here and in other modules) decide what a list shows and read the status-bar configuration
+// document through GetUserDefinedAttributeDOMDoc.
+#pragma once
+
+#include "VORCommand.h"
+#include "VORIDOMDocument.h"
+#include "VORModelTypes.h"
+#include "VORUnicodeString.h"
+
+class QELBaseScrollListZitBltRep;
+class VORISPPActivity;
+
+class QELBaseListZitBltCmd : public VORCommand {
+  VOR_DECLARE_CLASS(QELBaseListZitBltCmd, VORCommand)
+ public:
+  // owner: the activity whose ZitBlt this command fills (held). Parses the status-bar
+  // configuration file while it has not parsed once in the process.
+  explicit QELBaseListZitBltCmd(VORBaseUnknown* owner);
+
+  // With a ZitBlt rep as `from`: takes its name as the POD name and fills it. Returns 0.
+  VORStatusChangeRC Activate(VORCommand* from, VORNotification* notification) override;
+  // A views-change notification about the owner: refreshes the ZitBlt on the owner and on
+  // every ancestor when HandleEvent accepts it (an item unassignment refreshes once more).
+  virtual void OnActivityCallback(const char* event, void* clientData, VORNotification* notif,
+                                  void* subscriberData, int callbackId);
+  // Fills the list. rep is null for a ZitBlt that shows no list.
+  virtual void UpdateList(QELBaseScrollListZitBltRep* rep) = 0;
+
+  VORBaseUnknown_var GetOwner() const { return _owner; }
+  VORUnicodeString GetPODName() const { return _podName; }
+  void SetPODName(const VORUnicodeString& name) { _podName = name; }
+
+  // The root process of the owner's tree (one reference for the caller), or E_FAIL.
+  HRESULT GetRootActivity(VORISPPActivity** root);
+  // Registers OnActivityCallback on the root activity's views-change event (once).
+  void AddCallBacks();
+  // False when no callback was registered.
+  bool RemoveCallbacks();
+
+  // Forgets the parsed status-bar file (tests only: the product parses it once per process).
+  static void ForgetStatusBarConfigurationForTests();
+
+ protected:
+  ~QELBaseListZitBltCmd() override;
+  // Whether a modification of this kind on son concerns the list: child activities, item
+  // assignments and product IO changes.
+  virtual bool HandleEvent(SPPModifyKind kind, VORBaseUnknown* son);
+  // The parsed status-bar configuration file, null when it is missing or ill-formed.
+  VORIDOMDocument_var GetUserDefinedAttributeDOMDoc();
+
+ private:
+  static VORUnicodeString GetConfigFile();
+  static void InitializeData();
+  void RefreshOwnerAndAncestors();
+
+  VORBaseUnknown_var _owner;
+  int _callbackHandle = -1;
+  VORUnicodeString _podName;
+  VORHandle<VOREventPublisher> _callbackPublisher;
+
+  static VORIDOMDocument_var _spXmlDocument;
+  static bool _xmlParsed;
+};

@@ -1,0 +1,134 @@
+#include "QELBaseListZitBltCmd.h"
+
+#include "QELIZitBltMgr.h"
+#include "QELZitBltConfiguration.h"
+#include "QELZitBltRep.h"
+#include "VORISPPActivity.h"
+#include "VORISPPActivityModificationEvents.h"
+#include "VORSPPActivityNotification.h"
+
+VORIDOMDocument_var QELBaseListZitBltCmd::_spXmlDocument;
+bool QELBaseListZitBltCmd::_xmlParsed = false;
+
+QELBaseListZitBltCmd::QELBaseListZitBltCmd(VORBaseUnknown* owner)
+    : VORCommand(nullptr, "QELBaseListZitBltCmd"), _owner(owner) {
+  if (!_xmlParsed)
+    InitializeData();
+}
+
+QELBaseListZitBltCmd::~QELBaseListZitBltCmd() {
+  RemoveCallbacks();
+}
+
+VORUnicodeString QELBaseListZitBltCmd::GetConfigFile() {
+  return QELZitBltConfiguration::StatusBarConfigFile();
+}
+
+void QELBaseListZitBltCmd::InitializeData() {
+  VORIDOMDocument_var document;
+  _xmlParsed = QELZitBltConfiguration::ParseConfigFile(GetConfigFile(), document) && document;
+  _spXmlDocument = _xmlParsed ? document : VORIDOMDocument_var();
+}
+
+VORIDOMDocument_var QELBaseListZitBltCmd::GetUserDefinedAttributeDOMDoc() {
+  return _spXmlDocument;
+}
+
+void QELBaseListZitBltCmd::ForgetStatusBarConfigurationForTests() {
+  _spXmlDocument = NULL_var;
+  _xmlParsed = false;
+}
+
+VORStatusChangeRC QELBaseListZitBltCmd::Activate(VORCommand* from, VORNotification*) {
+  if (auto* rep = dynamic_cast<QELZitBltRep*>(from)) {
+    _podName = rep->GetName();
+    UpdateList(rep->GetScrollListRep());
+  }
+  return 0;
+}
+
+bool QELBaseListZitBltCmd::HandleEvent(SPPModifyKind kind, VORBaseUnknown*) {
+  return kind == SPPChildActivityChanged || kind == SPPItemAssigned || kind == SPPItemUnassigned ||
+         kind == SPPProductIOChanged;
+}
+
+void QELBaseListZitBltCmd::RefreshOwnerAndAncestors() {
+  if (QELIZitBltMgr_var manager(_owner); manager)
+    manager->UpdateZitBlt(_podName);
+  VORISPPActivity_var activity(_owner);
+  VORBaseUnknown_var father;
+  if (activity)
+    activity->GetFatherActivity(father);
+  for (int guard = 0; father && guard < 100000; ++guard) {
+    if (QELIZitBltMgr_var manager(father); manager)
+      manager->UpdateZitBlt(_podName);
+    VORISPPActivity_var up(father);
+    VORBaseUnknown_var next;
+    if (up)
+      up->GetFatherActivity(next);
+    father = next;
+  }
+}
+
+void QELBaseListZitBltCmd::OnActivityCallback(const char*, void*, VORNotification* notif, void*,
+                                              int) {
+  auto* activityNotification = dynamic_cast<VORSPPActivityNotification*>(notif);
+  if (activityNotification == nullptr)
+    return;
+  // Keep this command alive while refreshes run (a refresh may end in deferred deletions).
+  VORHandle<QELBaseListZitBltCmd> self(this);
+  const SPPModifyKind kind = activityNotification->GetKind();
+  if (HandleEvent(kind, activityNotification->GetSon()))
+    RefreshOwnerAndAncestors();
+  else if (kind == SPPActivityDeleted) {
+    RemoveCallbacks();
+    return;
+  }
+  // An unassignment refreshes a second time, accepted or not.
+  if (kind == SPPItemUnassigned)
+    RefreshOwnerAndAncestors();
+}
+
+HRESULT QELBaseListZitBltCmd::GetRootActivity(VORISPPActivity** root) {
+  if (root == nullptr)
+    return E_FAIL;
+  *root = nullptr;
+  VORISPPActivity_var activity(_owner);
+  VORBaseUnknown_var rootObject;
+  if (!activity || FAILED(activity->GetRootActivity(rootObject)))
+    return E_FAIL;
+  VORISPPActivity_var rootActivity(rootObject);
+  if (!rootActivity)
+    return E_FAIL;
+  *root = rootActivity.Detach();
+  return S_OK;
+}
+
+void QELBaseListZitBltCmd::AddCallBacks() {
+  if (_callbackHandle != -1)
+    return;
+  VORISPPActivity* root = nullptr;
+  if (FAILED(GetRootActivity(&root)))
+    return;
+  VORISPPActivityModificationEvents_var events{VORBaseUnknown_var(root)};
+  root->Release();
+  if (!events || events->GetEventPublisher() == nullptr)
+    return;
+  _callbackPublisher = events->GetEventPublisher();
+  _callbackHandle = static_cast<int>(_callbackPublisher->AddCallback(
+      VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(),
+      [this](VORBaseUnknown*, const std::string& event, VORNotification* n, void* data,
+             VORCallbackId id) {
+        OnActivityCallback(event.c_str(), data, n, nullptr, static_cast<int>(id));
+      },
+      nullptr, this));
+}
+
+bool QELBaseListZitBltCmd::RemoveCallbacks() {
+  if (_callbackHandle == -1 || !_callbackPublisher)
+    return false;
+  _callbackPublisher->RemoveCallback(static_cast<VORCallbackId>(_callbackHandle));
+  _callbackPublisher = NULL_var;
+  _callbackHandle = -1;
+  return true;
+}

@@ -1,0 +1,150 @@
+#include "QELEZitBltCBSubscriber.h"
+
+#include "QELBaseListZitBltCmd.h"
+#include "QELIUpdateManufAssly.h"
+#include "QELIZitBltMgr.h"
+#include "QELZitBltConfiguration.h"
+#include "VORCommandHeader.h"
+#include "VORDeferredDeletion.h"
+#include "VORISPPActivity.h"
+#include "VORISPPActivityModificationEvents.h"
+#include "VORISpecObject.h"
+#include "VORSPPActivityNotification.h"
+
+namespace {
+bool callbacksSuspended = false;
+
+VORString Narrow(const VORUnicodeString& s) {
+  return VORString(s.ConvertToUTF8().c_str());
+}
+}  // namespace
+
+QELEZitBltCBSubscriber::~QELEZitBltCBSubscriber() {
+  for (auto& entry : _commands)
+    VORCommandDeletion(entry.second);
+  _commands.clear();
+  DropCallback();
+}
+
+HRESULT QELEZitBltCBSubscriber::Subscribe() {
+  if (_subscribed)
+    return S_OK;
+  VORBaseUnknown* activity = GetExtendedObject();
+  VORISPPActivity_var spp{VORBaseUnknown_var(activity)};
+  VORBaseUnknown_var root;
+  if (spp)
+    spp->GetRootActivity(root);
+  if (VORISPPActivityModificationEvents_var events(root);
+      events && events->GetEventPublisher() != nullptr && _callbackHandle == 0) {
+    _publisher = events->GetEventPublisher();
+    _root = root.Identity();
+    _callbackHandle = _publisher->AddCallback(
+        VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(),
+        [this](VORBaseUnknown*, const std::string& event, VORNotification* n, void* data,
+               VORCallbackId id) { OnViewsChange(event, n, data, id); },
+        nullptr, this);
+  }
+  CreateUpdateCommands();
+  _subscribed = true;
+  return S_OK;
+}
+
+void QELEZitBltCBSubscriber::CreateUpdateCommands() {
+  VORBaseUnknown* activity = GetExtendedObject();
+  QELIZitBltMgr_var manager{VORBaseUnknown_var(activity)};
+  VORIDOMDocument_var document;
+  if (!manager || !manager->LoadConfiguration(document) || !document)
+    return;
+  VORISpecObject_var spec{VORBaseUnknown_var(activity)};
+  VORUnicodeString typeName;
+  if (spec)
+    spec->GetTypeName(typeName);
+  for (const QELZitBltDefinition& d : QELZitBltConfiguration::DefinitionsFor(document, typeName)) {
+    if (!d.hasUpdateData)
+      continue;
+    auto header = VORCommandHeader_var::Adopt(
+        new VORCommandHeader(Narrow(d.updateCmdName), Narrow(d.updateLoadModule),
+                             Narrow(d.updateCmdName), activity, VORCommandHeader::Available));
+    VORCommand* created = header->CreateCommand();
+    auto* command = dynamic_cast<QELBaseListZitBltCmd*>(created);
+    if (command == nullptr) {
+      VORCommandDeletion(created);
+      continue;
+    }
+    command->Activate(nullptr, nullptr);
+    command->SetPODName(d.name);
+    bool known = false;
+    for (auto& entry : _commands)
+      known = known || entry.first == d.name;
+    if (known)
+      VORCommandDeletion(command);  // one command per ZitBlt name: the first is kept
+    else
+      _commands.emplace_back(d.name, command);
+  }
+}
+
+void QELEZitBltCBSubscriber::DropCallback() {
+  if (_callbackHandle != 0 && _publisher)
+    _publisher->RemoveCallback(_callbackHandle);
+  _callbackHandle = 0;
+  _publisher = NULL_var;
+  _root = nullptr;
+}
+
+HRESULT QELEZitBltCBSubscriber::Unsubscribe() {
+  if (_subscribed) {
+    for (auto& entry : _commands)
+      VORCommandDeletion(entry.second);
+    _commands.clear();
+    _subscribed = false;
+  }
+  DropCallback();
+  return S_OK;
+}
+
+HRESULT QELEZitBltCBSubscriber::GetUpdateCommand(const VORUnicodeString& zitBltName,
+                                                 QELBaseListZitBltCmd** command) {
+  if (command == nullptr)
+    return E_FAIL;
+  for (auto& entry : _commands) {
+    if (entry.first == zitBltName) {
+      *command = entry.second;
+      return S_OK;
+    }
+  }
+  return E_FAIL;
+}
+
+void QELEZitBltCBSubscriber::SetCallbacksSuspended(bool suspended) {
+  callbacksSuspended = suspended;
+}
+
+bool QELEZitBltCBSubscriber::AreCallbacksSuspended() {
+  return callbacksSuspended;
+}
+
+void QELEZitBltCBSubscriber::OnViewsChange(const std::string& event, VORNotification* notification,
+                                           void* clientData, VORCallbackId id) {
+  const bool remembered = callbacksSuspended;
+  bool cleared = false;
+  // An assembly update refreshes even while muted.
+  if (QELIUpdateManufAssly_var update{VORBaseUnknown_var(_root)};
+      update && update->IsUpdateInProgress()) {
+    callbacksSuspended = false;
+    cleared = true;
+  }
+  if (!callbacksSuspended) {
+    auto* activityNotification = dynamic_cast<VORSPPActivityNotification*>(notification);
+    if (activityNotification != nullptr && activityNotification->GetFather() != nullptr) {
+      if (activityNotification->GetFather()->GetIdentity() != GetExtendedObject()->GetIdentity())
+        return;  // another activity's change: the flag is deliberately not restored here
+      // The commands may refresh and queue deletions: iterate over a copy.
+      auto commands = _commands;
+      for (auto& entry : commands)
+        entry.second->OnActivityCallback(event.c_str(), clientData, notification, nullptr,
+                                         static_cast<int>(id));
+    }
+  }
+  if (cleared)
+    callbacksSuspended = remembered;
+}

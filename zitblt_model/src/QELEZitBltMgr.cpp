@@ -1,0 +1,306 @@
+#include "QELEZitBltMgr.h"
+
+#include "QELBaseListZitBltCmd.h"
+#include "QELIPertNode.h"
+#include "QELIZitBltCBSubscriber.h"
+#include "QELPertNotifications.h"
+#include "QELZitBltConfiguration.h"
+#include "QELZitBltRep.h"
+#include "VORCommandHeader.h"
+#include "VORDeferredDeletion.h"
+#include "VORIModelEvents.h"
+#include "VORISPPActivity.h"
+#include "VORISpecObject.h"
+#include "VORModify.h"
+
+namespace {
+VORString Narrow(const VORUnicodeString& s) {
+  return VORString(s.ConvertToUTF8().c_str());
+}
+
+// The names whose refresh climbs to the parent activity's status bars.
+bool IsStatusBar(const VORUnicodeString& name) {
+  for (const char* bar : {"BIWStationStatusBars", "BIWPointFasteningStatusBars",
+                          "BIWCurveFasteningStatusBars", "BIWGroupingStatusBars"}) {
+    if (name == VORUnicodeString(bar))
+      return true;
+  }
+  return false;
+}
+}  // namespace
+
+QELEZitBltMgr::~QELEZitBltMgr() {
+  for (auto& entry : _zitBlts)
+    VORCommandDeletion(entry.second);
+}
+
+bool QELEZitBltMgr::LoadConfiguration(VORIDOMDocument_var& document) {
+  return QELZitBltConfiguration::LoadConfiguration(document);
+}
+
+QELZitBltRep* QELEZitBltMgr::Find(const VORUnicodeString& name) const {
+  for (const auto& entry : _zitBlts) {
+    if (entry.first == name)
+      return entry.second;
+  }
+  return nullptr;
+}
+
+void QELEZitBltMgr::BuildZitBlts() {
+  VORBaseUnknown* activity = GetExtendedObject();
+  VORIDOMDocument_var document;
+  LoadConfiguration(document);
+  // The subscriber comes first so that the update commands exist before the reps.
+  QELIZitBltCBSubscriber_var subscriber{VORBaseUnknown_var(activity)};
+  if (subscriber && !subscriber->IsSubscribed())
+    subscriber->Subscribe();
+  if (!document)
+    return;
+  VORISpecObject_var spec{VORBaseUnknown_var(activity)};
+  VORUnicodeString typeName;
+  if (spec)
+    spec->GetTypeName(typeName);
+  for (const QELZitBltDefinition& d : QELZitBltConfiguration::DefinitionsFor(document, typeName)) {
+    auto header = VORCommandHeader_var::Adopt(
+        new VORCommandHeader(Narrow(d.name), Narrow(d.loadModule), Narrow(d.type), activity,
+                             VORCommandHeader::Available));
+    VORCommand* created = header->CreateCommand();
+    auto* rep = dynamic_cast<QELZitBltRep*>(created);
+    if (rep == nullptr) {
+      VORCommandDeletion(created);  // not a ZitBlt (or nothing): skipped
+      continue;
+    }
+    if (Find(d.name) != nullptr) {
+      VORCommandDeletion(rep);  // one ZitBlt per name: the first is kept
+      continue;
+    }
+    rep->SetName(d.name);
+    rep->SetLocation(d.location);
+    rep->SetPriority(d.priority);
+    rep->SetInitialState(d.initialState);
+    rep->SetIcon(d.iconFile);
+    _zitBlts.emplace_back(d.name, rep);
+    QELBaseListZitBltCmd* command = nullptr;
+    if (subscriber && SUCCEEDED(subscriber->GetUpdateCommand(d.name, &command)) && command)
+      command->Activate(rep, nullptr);
+  }
+}
+
+int QELEZitBltMgr::BuildZitBltReps(VORViewer* viewer) {
+  if (viewer == nullptr)
+    return 1;
+  if (!_initialised) {
+    BuildZitBlts();
+    _initialised = true;
+  }
+  QELIPertNode_var node{VORBaseUnknown_var(GetExtendedObject())};
+  double x = 0.0, y = 0.0, w = 0.0, h = 0.0;
+  if (node) {
+    node->GetPosition(x, y);
+    node->GetSize(w, h);
+  }
+  _lastX = x;
+  _lastY = y;
+  _lastWidth = w;
+  _lastHeight = h;
+  for (auto& entry : _zitBlts) {
+    QELZitBltRep* rep = entry.second;
+    rep->BuildRep(viewer);
+    if (rep->GetZitBltBtn() != nullptr)
+      Place(rep, x, y, w, h);
+    // New bags are shown: a hidden ZitBlt stays hidden across a rebuild.
+    if (rep->GetStatus() != 1)
+      rep->SetStatus(rep->GetStatus());
+    if (!rep->IsButtonCollapse())
+      rep->ChangeBtnState();
+  }
+  return 1;
+}
+
+void QELEZitBltMgr::AnchorFor(const VORUnicodeString& location, double x, double y, double w,
+                              double h, double& ax, double& ay) {
+  // Offsets are single precision; the button extent is fixed at 0 so that the anchor is the
+  // corner or edge midpoint itself. Paired keywords ("lefttop"/"topleft") come out the same.
+  const float hw = static_cast<float>(w / 2.0);
+  const float hh = static_cast<float>(h / 2.0);
+  const float button = 0.0f;
+  const std::string l = location.ConvertToUTF8();
+  float dx = 0.0f;
+  float dy = 0.0f;
+  if (l == "lefttop" || l == "topleft") {
+    dx = -hw + button / 2;
+    dy = hh - button / 2;
+  } else if (l == "leftmiddle") {
+    dx = -hw + button / 2;
+  } else if (l == "leftbottom" || l == "bottomleft") {
+    dx = -hw + button / 2;
+    dy = -hh + button / 2;
+  } else if (l == "righttop" || l == "topright") {
+    dx = hw - button / 2;
+    dy = hh - button / 2;
+  } else if (l == "rightmiddle") {
+    dx = hw - button / 2;
+  } else if (l == "rightbottom" || l == "bottomright") {
+    dx = hw - button / 2;
+    dy = -hh + button / 2;
+  } else if (l == "topmiddle") {
+    dy = hh - button / 2;
+  } else if (l == "bottommiddle") {
+    dy = -hh + button / 2;
+  }
+  ax = x + dx;
+  ay = y + dy;
+}
+
+void QELEZitBltMgr::Place(QELZitBltRep* rep, double x, double y, double w, double h) {
+  VOR2DBagRep* button = rep->GetZitBltBtn();
+  VOR2DBagRep* expanded = rep->GetZitBltExpanded();
+  if (button == nullptr || expanded == nullptr)
+    return;
+  rep->SetPositioningLimits(x - w / 2, y - h / 2, x + w / 2, y + h / 2);
+  double ax = 0.0;
+  double ay = 0.0;
+  AnchorFor(rep->GetLocation(), x, y, w, h, ax, ay);
+  VOR3x3Matrix matrix;
+  matrix.SetTranslation(ax, ay);
+  button->SetMatrix(matrix);
+  expanded->SetMatrix(matrix);
+}
+
+HRESULT QELEZitBltMgr::GetZitBltNames(VORListValVORUnicodeString*& names) {
+  if (!_initialised) {
+    BuildZitBlts();
+    _initialised = true;
+  }
+  names = new VORListValVORUnicodeString();
+  for (const auto& entry : _zitBlts)
+    names->Append(entry.first);
+  return S_OK;
+}
+
+HRESULT QELEZitBltMgr::SetZitBltStatus(const VORUnicodeString& name, unsigned char status) {
+  HRESULT result = S_OK;
+  if (name == VORUnicodeString("All")) {
+    _overallStatus = status;
+  } else if (QELZitBltRep* rep = Find(name)) {
+    rep->SetStatus(status);
+  } else {
+    result = E_FAIL;
+  }
+  VORBaseUnknown* activity = GetExtendedObject();
+  if (VORIModelEvents_var events{VORBaseUnknown_var(activity)}; events) {
+    auto modify =
+        VORHandle<VORModify>::Adopt(new VORModify(activity, VORBaseUnknown::ClassId(), 1));
+    events->Dispatch(modify);
+    auto info = VORHandle<QELPertAppInfoNotify>::Adopt(
+        new QELPertAppInfoNotify(VORBaseUnknown_var(activity)));
+    events->Dispatch(info);
+  }
+  return result;
+}
+
+HRESULT QELEZitBltMgr::GetZitBltStatus(const VORUnicodeString& name, unsigned char& status) {
+  if (name == VORUnicodeString("All")) {
+    status = _overallStatus;
+    return S_OK;
+  }
+  QELZitBltRep* rep = Find(name);
+  if (rep == nullptr)
+    return E_FAIL;
+  status = rep->GetStatus();
+  return S_OK;
+}
+
+HRESULT QELEZitBltMgr::GetZitBlt(const VORUnicodeString& name, QELZitBltRep** rep) {
+  if (rep == nullptr)
+    return E_FAIL;
+  *rep = Find(name);
+  return *rep != nullptr ? S_OK : E_FAIL;
+}
+
+HRESULT QELEZitBltMgr::RemoveZitBlts() {
+  if (QELIZitBltCBSubscriber_var subscriber{VORBaseUnknown_var(GetExtendedObject())};
+      subscriber && subscriber->IsSubscribed())
+    subscriber->Unsubscribe();
+  for (auto& entry : _zitBlts)
+    VORCommandDeletion(entry.second);
+  _zitBlts.clear();
+  _initialised = false;
+  _overallStatus = 0;  // not back to 1: kept so
+  return S_OK;
+}
+
+void QELEZitBltMgr::UpdateZitBltPositions() {
+  QELIPertNode_var node{VORBaseUnknown_var(GetExtendedObject())};
+  if (!node)
+    return;
+  double x = 0.0, y = 0.0, w = 0.0, h = 0.0;
+  node->GetPosition(x, y);
+  node->GetSize(w, h);
+  if (_lastX == 0.0 && _lastY == 0.0) {
+    // Never placed: only remember the geometry.
+    _lastX = x;
+    _lastY = y;
+    _lastWidth = w;
+    _lastHeight = h;
+    return;
+  }
+  const bool sameSize = w == _lastWidth && h == _lastHeight;
+  for (auto& entry : _zitBlts) {
+    QELZitBltRep* rep = entry.second;
+    rep->SetPositioningLimits(x - w / 2, y - h / 2, x + w / 2, y + h / 2);
+    if (sameSize) {
+      rep->TransfromPoD(x - _lastX, y - _lastY);
+      continue;
+    }
+    // Keep the free position at the same relative place of the resized rectangle.
+    const double oldLeft = _lastX - _lastWidth / 2;
+    const double oldRight = _lastX + _lastWidth / 2;
+    const double oldTop = _lastY + _lastHeight / 2;
+    const double oldBottom = _lastY - _lastHeight / 2;
+    double px = 0.0;
+    double py = 0.0;
+    rep->GetPoDPosition(px, py);
+    if (oldLeft == oldRight || oldTop == oldBottom)
+      continue;  // a degenerate old box gives no relative place
+    const double nx = (x - w / 2) + ((oldLeft - px) / (oldLeft - oldRight)) * w;
+    const double ny = (y + h / 2) - ((oldTop - py) / (oldTop - oldBottom)) * h;
+    rep->SetPoDPosition(nx, ny);
+  }
+  _lastX = x;
+  _lastY = y;
+  _lastWidth = w;
+  _lastHeight = h;
+}
+
+void QELEZitBltMgr::UpdateZitBlt(const VORUnicodeString& name) {
+  VORBaseUnknown* activity = GetExtendedObject();
+  QELIZitBltCBSubscriber_var subscriber{VORBaseUnknown_var(activity)};
+  if (!subscriber)
+    return;
+  QELZitBltRep* rep = Find(name);
+  QELBaseListZitBltCmd* command = nullptr;
+  if (FAILED(subscriber->GetUpdateCommand(name, &command)) || command == nullptr)
+    return;
+  command->UpdateList(rep != nullptr ? rep->GetScrollListRep() : nullptr);
+  if (!IsStatusBar(name))
+    return;
+  VORISPPActivity_var spp{VORBaseUnknown_var(activity)};
+  VORBaseUnknown_var father;
+  if (spp)
+    spp->GetFatherActivity(father);
+  if (QELIZitBltMgr_var parent(father); parent) {
+    parent->UpdateZitBlt("BIWStationStatusBars");
+    parent->UpdateZitBlt("BIWGroupingStatusBars");
+  }
+}
+
+void QELEZitBltMgr::UpdateAllZitBlts() {
+  VORListValVORUnicodeString* names = nullptr;
+  GetZitBltNames(names);
+  if (names == nullptr)
+    return;
+  for (const VORUnicodeString& name : *names)
+    UpdateZitBlt(name);
+  delete names;
+}

@@ -1,0 +1,115 @@
+// The on-screen form of one ZitBlt on one PERT node: a button bag holding the icon and an
+// expanded bag holding what the opened ZitBlt shows, both carrying the same translation. A
+// manipulator on the button toggles the ZitBlt on a click and slides it along one edge of its
+// node within the positioning limits on a drag. Created by name ("fctCreateQELZitBltRep") by
+// the ZitBlt manager, which sets its strings, calls BuildRep and places it.
+#pragma once
+
+#include "VOR2DBagRep.h"
+#include "VORCommand.h"
+#include "VORISO.h"
+#include "VORModelForRep2D.h"
+#include "VORUnicodeString.h"
+#include "VORViewer.h"
+
+class VOR2DManipulator;
+class QELBaseScrollListZitBltRep;
+
+class QELZitBltRep : public VORCommand {
+  VOR_DECLARE_CLASS(QELZitBltRep, VORCommand)
+ public:
+  QELZitBltRep();
+
+  // Creates the bags (shown through the current editor's interactive set when there is one),
+  // the icon and the "ActivManip" manipulator. viewer is used to redraw (held).
+  virtual void BuildRep(VORViewer* viewer);
+  virtual void ExpandZitBlt();
+  virtual void CollapseZitBlt();
+  // Toggles open/closed; the flags are set before the virtual Expand/Collapse runs.
+  virtual void ChangeBtnState();
+
+  // A click on the button toggles the ZitBlt; a drag slides it within the limits. Both are then
+  // sent on to the father command.
+  VORNotifPropagation AnalyseNotification(VORCommand* from, VORNotification* notif) override;
+
+  // The scroll-list form of this rep, for the list update commands; null for a plain ZitBlt.
+  virtual QELBaseScrollListZitBltRep* GetScrollListRep() { return nullptr; }
+
+  void SetName(const VORUnicodeString& name) { _name = name; }
+  VORUnicodeString GetName() const { return _name; }
+  void SetLocation(const VORUnicodeString& location) { _location = location; }
+  VORUnicodeString GetLocation() const { return _location; }
+  void SetPriority(const VORUnicodeString& priority) { _priority = priority; }
+  VORUnicodeString GetPriority() const { return _priority; }
+  void SetInitialState(const VORUnicodeString& state) { _initialState = state; }
+  VORUnicodeString GetInitialState() const { return _initialState; }
+  // The icon's base name (".bmp" is added); only read by BuildRep and SetZitbltButtonGrey.
+  void SetIcon(const VORUnicodeString& icon) { _icon = icon; }
+  VORUnicodeString GetIcon() const { return _icon; }
+
+  // 1 shows both bags, 0 hides both; other values are only stored.
+  void SetStatus(unsigned char status);
+  unsigned char GetStatus() const { return _status; }
+
+  VOR2DBagRep* GetZitBltBtn() const { return _btnBag.get(); }
+  VOR2DBagRep* GetZitBltExpanded() const { return _expandedBag.get(); }
+  VOR2DManipulator* GetManipulator() const { return _manipulator; }
+  bool IsButtonCollapse() const { return _collapsed != 0; }
+  int GetButtonState() const { return _btnState; }
+
+  // Rebuilds the button's icon, in grey when grey is 1. Keeps the old icon when the file is
+  // missing or unreadable.
+  void SetZitbltButtonGrey(unsigned char grey);
+
+  // The bags' translation (no limit check).
+  void SetPoDPosition(double x, double y);
+  void GetPoDPosition(double& x, double& y) const;
+  void TransfromPoD(double dx, double dy);
+
+  // The node rectangle; stored widened by half the button (min x narrowed).
+  void SetPositioningLimits(double xmin, double ymin, double xmax, double ymax);
+  void GetPositioningLimits(double& xmin, double& ymin, double& xmax, double& ymax) const;
+  bool IsVerticalLimitOn() const { return _verticalLimit != 0; }
+  bool IsHorizontalLimitOn() const { return _horizontalLimit != 0; }
+
+  // The base ZitBlt has no expanded content to empty: E_FAIL.
+  HRESULT EmptyExpandedBagRep();
+
+ protected:
+  ~QELZitBltRep() override;
+  virtual void ReDraw();
+  void SetTranslation(double x, double y);
+
+  int _btnState = 0;
+  VOR2DBagRep_var _btnBag;
+  VOR2DBagRep_var _expandedBag;
+  VOR2DManipulator* _manipulator = nullptr;  // the creator's reference
+  unsigned char _collapsed = 1;
+  VORUnicodeString _icon;
+  VORViewer_var _viewer;
+  VORUnicodeString _name;
+  VORUnicodeString _location;
+  VORUnicodeString _priority;
+  VORUnicodeString _initialState;
+  unsigned char _status = 1;
+  float _lastDragX = 0.0f;
+  float _lastDragY = 0.0f;
+  float _minX = 0.0f;
+  float _minY = 0.0f;
+  float _maxX = 0.0f;
+  float _maxY = 0.0f;
+  unsigned char _verticalLimit = 0;
+  unsigned char _horizontalLimit = 0;
+  VORModelForRep2D_var _btnModel;
+  VORModelForRep2D_var _expandedModel;
+  VORISO_var _iso;  // the set the models were added to
+
+ private:
+  void SetShowMode(int mode);
+  void RemoveModels();
+  void DeleteManipulator();
+};
+VOR_DECLARE_HANDLE(QELZitBltRep);
+
+// Offset of the icon from the ZitBlt's anchor for a location keyword and an icon of w x h.
+void QELZitBltIconOffset(const VORUnicodeString& location, float w, float h, float& ox, float& oy);

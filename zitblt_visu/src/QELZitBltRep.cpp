@@ -1,0 +1,305 @@
+#include "QELZitBltRep.h"
+
+#include "VOR2DImagePixelRep.h"
+#include "VOR2DManipulator.h"
+#include "VORCommandHeader.h"
+#include "VORDeferredDeletion.h"
+#include "VORFrmEditor.h"
+#include "VORPixelImage.h"
+
+namespace {
+// Keywords that put the button on the top or bottom edge: it slides along x.
+bool IsHorizontalEdge(const VORUnicodeString& location) {
+  for (const char* keyword :
+       {"topleft", "topmiddle", "topright", "bottomleft", "bottommiddle", "bottomright"}) {
+    if (location == VORUnicodeString(keyword))
+      return true;
+  }
+  return false;
+}
+
+VORISO* CurrentISO() {
+  VORFrmEditor* editor = VORFrmEditor::GetCurrentEditor();
+  return editor != nullptr ? editor->GetISO() : nullptr;
+}
+}  // namespace
+
+void QELZitBltIconOffset(const VORUnicodeString& location, float w, float h, float& ox, float& oy) {
+  // The halves are double products narrowed to float.
+  const float hw = static_cast<float>(w * 0.5);
+  const float hh = static_cast<float>(h * 0.5);
+  const std::string l = location.ConvertToUTF8();
+  ox = 0.0f;
+  oy = 0.0f;
+  if (l == "lefttop" || l == "leftbottom" || l == "bottomright") {
+    ox = -hw;
+    oy = -hh;
+  } else if (l == "leftmiddle") {
+    ox = -hw;
+  } else if (l == "righttop" || l == "rightbottom" || l == "bottomleft") {
+    ox = hw;
+    oy = -hh;
+  } else if (l == "rightmiddle") {
+    ox = hw;
+  } else if (l == "topleft") {
+    ox = hw;
+    oy = hh;
+  } else if (l == "topmiddle") {
+    oy = hh;
+  } else if (l == "topright") {
+    ox = -hw;
+    oy = hh;
+  } else if (l == "bottommiddle") {
+    oy = -hh;
+  }
+}
+
+QELZitBltRep::QELZitBltRep() : VORCommand(nullptr, "QELZitBltRep") {}
+
+QELZitBltRep::~QELZitBltRep() {
+  DeleteManipulator();
+  _verticalLimit = 0;
+  _horizontalLimit = 0;
+  RemoveModels();
+}
+
+void QELZitBltRep::DeleteManipulator() {
+  if (_manipulator == nullptr)
+    return;
+  // The manipulator holds the button bag: let go of it so that neither keeps the other alive.
+  _manipulator->RemoveAllElements();
+  _manipulator->SetFather(nullptr);
+  VORCommandDeletion(_manipulator);
+  _manipulator = nullptr;
+}
+
+void QELZitBltRep::RemoveModels() {
+  if (_iso) {
+    if (_expandedModel)
+      _iso->RemoveElement(_expandedModel);
+    if (_btnModel)
+      _iso->RemoveElement(_btnModel);
+  }
+  _iso = NULL_var;
+  _btnModel = NULL_var;
+  _expandedModel = NULL_var;
+}
+
+void QELZitBltRep::BuildRep(VORViewer* viewer) {
+  // A second build replaces the first: its models leave the interactive set.
+  RemoveModels();
+  _btnBag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  _expandedBag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  _viewer = viewer;
+
+  if (VORISO* iso = CurrentISO()) {
+    _iso = iso;
+    _btnModel = VORModelForRep2D_var::Adopt(new VORModelForRep2D());
+    _btnModel->SetRep(_btnBag);
+    _expandedModel = VORModelForRep2D_var::Adopt(new VORModelForRep2D());
+    _expandedModel->SetRep(_expandedBag);
+    iso->AddElement(_btnModel);
+    iso->AddElement(_expandedModel);
+  }
+
+  SetZitbltButtonGrey(0);
+  if (_collapsed)
+    _expandedBag->SetShowMode(1);
+
+  DeleteManipulator();
+  _manipulator = new VOR2DManipulator(this, "ActivManip", _btnBag, 1, 0);
+  if (IsHorizontalEdge(_location)) {
+    _manipulator->SetDirection(VORMathVector2Df(1.0f, 0.0f));
+    _horizontalLimit = 1;
+    _verticalLimit = 0;
+  } else {
+    _manipulator->SetDirection(VORMathVector2Df(0.0f, 1.0f));
+    _verticalLimit = 1;
+    _horizontalLimit = 0;
+  }
+}
+
+void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
+  if (!_btnBag)
+    return;
+  VORUnicodeString path;
+  if (FAILED(VORGetImagePathName(_icon + VORUnicodeString(".bmp"), path)))
+    return;
+  VORPixelImage* image = VORPixelImage::CreateFromFile(path, 0);
+  if (image == nullptr)
+    return;
+  image->AddRef();
+  for (int i = _btnBag->GetSize(); i >= 1; --i)
+    _btnBag->DestroyChild(_btnBag->GetChild(i));
+
+  auto imageRep = VOR2DImagePixelRep_var::Adopt(
+      new VOR2DImagePixelRep(VORMathPoint2Df(-2.0f, -2.0f), image, 1, 0, 0, 0));
+  float xmin = 0.0f, ymin = 0.0f, xmax = 0.0f, ymax = 0.0f;
+  imageRep->GetBoundingBox(xmin, ymin, xmax, ymax);
+  float ox = 0.0f;
+  float oy = 0.0f;
+  QELZitBltIconOffset(_location, xmax - xmin, ymax - ymin, ox, oy);
+  imageRep->Modify(VORMathPoint2Df(static_cast<float>(ox - 2.0), static_cast<float>(oy - 2.0)));
+
+  VORPixelImage* pixels = imageRep->GetPixelImage();
+  if (grey == 1)
+    pixels->Convert(VORPixelImage::Grey);
+  pixels->Convert(VORPixelImage::RGBA);
+  pixels->SetTransparency(0);
+  imageRep->SetAlphaMode(1);
+
+  _btnBag->AddChild(imageRep);
+  image->Release();
+  image->Release();
+}
+
+void QELZitBltRep::SetShowMode(int mode) {
+  if (_expandedBag)
+    _expandedBag->SetShowMode(mode);
+  ReDraw();
+}
+
+void QELZitBltRep::ExpandZitBlt() {
+  _collapsed = 0;
+  if (_expandedBag) {
+    _expandedBag->SetShowMode(0);
+    if (_viewer)
+      _viewer->Draw();
+  }
+}
+
+void QELZitBltRep::CollapseZitBlt() {
+  _collapsed = 1;
+  if (_expandedBag) {
+    _expandedBag->SetShowMode(1);
+    if (_viewer)
+      _viewer->Draw();
+  }
+}
+
+void QELZitBltRep::ChangeBtnState() {
+  if (_btnState != 0) {
+    _collapsed = 1;
+    _btnState = 0;
+    CollapseZitBlt();
+  } else {
+    _collapsed = 0;
+    _btnState = 1;
+    ExpandZitBlt();
+  }
+}
+
+void QELZitBltRep::ReDraw() {
+  if (_viewer)
+    _viewer->Draw();
+}
+
+void QELZitBltRep::SetStatus(unsigned char status) {
+  _status = status;
+  if (status != 0 && status != 1)
+    return;
+  // Shown means both bags, whatever the open/closed state says.
+  const int mode = status == 1 ? 0 : 1;
+  if (_btnBag)
+    _btnBag->SetShowMode(mode);
+  if (_expandedBag)
+    _expandedBag->SetShowMode(mode);
+}
+
+void QELZitBltRep::SetTranslation(double x, double y) {
+  const VOR3x3Matrix matrix = VOR3x3Matrix::Translation(x, y);
+  if (_btnBag)
+    _btnBag->SetMatrix(matrix);
+  if (_expandedBag)
+    _expandedBag->SetMatrix(matrix);
+}
+
+void QELZitBltRep::SetPoDPosition(double x, double y) {
+  SetTranslation(x, y);
+  ReDraw();
+}
+
+void QELZitBltRep::GetPoDPosition(double& x, double& y) const {
+  if (!_btnBag || _btnBag->GetMatrix() == nullptr)
+    return;
+  _btnBag->GetMatrix()->GetTranslation(x, y);
+}
+
+void QELZitBltRep::TransfromPoD(double dx, double dy) {
+  if (!_btnBag || _btnBag->GetMatrix() == nullptr)
+    return;
+  double x = 0.0;
+  double y = 0.0;
+  _btnBag->GetMatrix()->GetTranslation(x, y);
+  // The step is added in single precision.
+  SetTranslation(static_cast<float>(x) + static_cast<float>(dx),
+                 static_cast<float>(y) + static_cast<float>(dy));
+  ReDraw();
+}
+
+void QELZitBltRep::SetPositioningLimits(double xmin, double ymin, double xmax, double ymax) {
+  if (!_btnBag)
+    return;
+  float bxmin = 0.0f, bymin = 0.0f, bxmax = 0.0f, bymax = 0.0f;
+  _btnBag->GetBoundingBox(bxmin, bymin, bxmax, bymax);
+  const float hbw = (bxmax - bxmin) * 0.5f;
+  const float hbh = (bymax - bymin) * 0.5f;
+  // Only min x is narrowed by the half button; the other three are widened. Kept so on purpose.
+  _minX = static_cast<float>(xmin - hbw);
+  _minY = static_cast<float>(ymin + hbh);
+  _maxX = static_cast<float>(xmax + hbw);
+  _maxY = static_cast<float>(ymax + hbh);
+}
+
+void QELZitBltRep::GetPositioningLimits(double& xmin, double& ymin, double& xmax,
+                                        double& ymax) const {
+  xmin = _minX;
+  ymin = _minY;
+  xmax = _maxX;
+  ymax = _maxY;
+}
+
+HRESULT QELZitBltRep::EmptyExpandedBagRep() {
+  return E_FAIL;
+}
+
+VORNotifPropagation QELZitBltRep::AnalyseNotification(VORCommand* from, VORNotification* notif) {
+  if (notif == nullptr || _manipulator == nullptr || from != _manipulator)
+    return VORNotifPropagate;
+  if (notif == _manipulator->GetVORActivate()) {
+    ChangeBtnState();
+    SendNotification(GetFather(), notif);
+    return VORNotifPropagate;
+  }
+  if (notif != _manipulator->GetVORManipulate())
+    return VORNotifPropagate;
+
+  VORMathAxis2D axis;
+  _manipulator->GetPosition(axis);
+  float px = 0.0f;
+  float py = 0.0f;
+  axis.GetOrigin(px, py);
+  // (0, 0) means no point was recorded yet: the first event only records it.
+  if ((_lastDragX != 0.0f || _lastDragY != 0.0f) && _btnBag && _btnBag->GetMatrix() != nullptr) {
+    const float dx = px - _lastDragX;
+    const float dy = py - _lastDragY;
+    double tx = 0.0;
+    double ty = 0.0;
+    _btnBag->GetMatrix()->GetTranslation(tx, ty);
+    const float cx = static_cast<float>(tx) + dx;
+    const float cy = static_cast<float>(ty) + dy;
+    // A refused step keeps the old drag point: the next step carries the refused distance.
+    if (_horizontalLimit && (cx > _maxX || cx < _minX))
+      return VORNotifPropagate;
+    if (_verticalLimit && (cy > _maxY || cy < _minY))
+      return VORNotifPropagate;
+    SetTranslation(cx, cy);
+    ReDraw();
+  }
+  _lastDragX = px;
+  _lastDragY = py;
+  SendNotification(GetFather(), notif);
+  return VORNotifPropagate;
+}
+
+VOR_EXPORT_COMMAND_FACTORY_NOARG(QELZitBltRep)
