@@ -353,7 +353,6 @@
         <item ref="P19" via="IO21"/>
         <item ref="P20" via="IO23"/>
         <resource ref="P27"/>
-        <resource ref="P28"/>
         <attribute name="Invest" type="double" value="250000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A18" label="Load FF010" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -361,6 +360,7 @@
           <input id="IO24" item="P20"/>
           <item ref="P19" via="IO22"/>
           <item ref="P20" via="IO24"/>
+          <resource ref="P28"/>
           <resource ref="P29"/>
         </activity>
         <activity id="A30" label="Clinch FF010-1" time="26" type="BIWActivityClinching" x="62.5" y="12.5">
@@ -389,7 +389,6 @@
         <item ref="P42" via="IO46"/>
         <item ref="P43" via="IO48"/>
         <resource ref="P52"/>
-        <resource ref="P53"/>
         <attribute name="Invest" type="double" value="251000"/>
         <attribute name="Shift" type="long" value="2"/>
         <activity id="A41" label="Load FF020" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -398,6 +397,7 @@
           <input id="IO49" item="P43"/>
           <item ref="P42" via="IO47"/>
           <item ref="P43" via="IO49"/>
+          <resource ref="P53"/>
         </activity>
         <activity id="A54" label="Stud weld FF020-1" time="21" type="BIWActivityStudWelding" x="62.5" y="12.5">
           <resource ref="P55"/>
@@ -423,13 +423,13 @@
         <item ref="P50" via="IO67"/>
         <item ref="P66" via="IO69"/>
         <resource ref="P73"/>
-        <resource ref="P74"/>
         <attribute name="Invest" type="double" value="252000"/>
         <attribute name="Shift" type="long" value="3"/>
         <activity id="A65" label="Load FF030" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO68" item="P50"/>
           <input id="IO70" item="P66"/>
           <item ref="P66" via="IO70"/>
+          <resource ref="P74"/>
         </activity>
         <activity id="A75" label="Spot weld FF030-1" time="15" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <resource ref="P76"/>
@@ -455,13 +455,13 @@
         <item ref="P71" via="IO88"/>
         <item ref="P87" via="IO90"/>
         <resource ref="P94"/>
-        <resource ref="P95"/>
         <attribute name="Invest" type="double" value="253000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A86" label="Load FF040" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO89" item="P71"/>
           <input id="IO91" item="P87"/>
           <item ref="P87" via="IO91"/>
+          <resource ref="P95"/>
           <resource ref="P96"/>
         </activity>
         <activity id="A97" label="Arc weld FF040-1" time="29" type="BIWActivityArcWelding" x="62.5" y="12.5">
@@ -485,7 +485,6 @@
         <item ref="P106" via="IO110"/>
         <item ref="P107" via="IO112"/>
         <resource ref="P116"/>
-        <resource ref="P117"/>
         <attribute name="Invest" type="double" value="254000"/>
         <attribute name="Shift" type="long" value="2"/>
         <activity id="A105" label="Load FF050" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -494,6 +493,7 @@
           <input id="IO113" item="P107"/>
           <item ref="P106" via="IO111"/>
           <item ref="P107" via="IO113"/>
+          <resource ref="P117"/>
         </activity>
         <activity id="A118" label="Spot weld FF050-1" time="19" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <output id="IO121" item="P114"/>
@@ -509,13 +509,13 @@
         <item ref="P114" via="IO125"/>
         <item ref="P124" via="IO127"/>
         <resource ref="P131"/>
-        <resource ref="P132"/>
         <attribute name="Invest" type="double" value="255000"/>
         <attribute name="Shift" type="long" value="3"/>
         <activity id="A123" label="Load FF060" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO126" item="P114"/>
           <input id="IO128" item="P124"/>
           <item ref="P124" via="IO128"/>
+          <resource ref="P132"/>
         </activity>
         <activity id="A133" label="Spot weld FF060-1" time="17" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <output id="IO136" item="P129"/>
@@ -533,7 +533,6 @@
         <item ref="P139" via="IO143"/>
         <item ref="P140" via="IO145"/>
         <resource ref="P149"/>
-        <resource ref="P150"/>
         <attribute name="Invest" type="double" value="256000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A138" label="Load FF070" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -542,6 +541,7 @@
           <input id="IO146" item="P140"/>
           <item ref="P139" via="IO144"/>
           <item ref="P140" via="IO146"/>
+          <resource ref="P150"/>
           <resource ref="P151"/>
         </activity>
         <activity id="A152" label="Apply sealant FF070-1" time="12" type="BIWActivitySealantApplication" x="62.5" y="12.5">
@@ -570,7 +570,6 @@
         <item ref="P164" via="IO168"/>
         <item ref="P165" via="IO170"/>
         <resource ref="P174"/>
-        <resource ref="P175"/>
         <item ref="M186"/>
         <resource ref="P187"/>
         <attribute name="Invest" type="double" value="257000"/>
@@ -581,6 +580,7 @@
           <input id="IO171" item="P165"/>
           <item ref="P164" via="IO169"/>
           <item ref="P165" via="IO171"/>
+          <resource ref="P175"/>
         </activity>
         <activity id="A176" label="Clinch FF080-1" time="26" type="BIWActivityClinching" x="62.5" y="12.5">
           <resource ref="P177"/>
@@ -604,12 +604,12 @@
         <output id="IO194" item="P193"/>
         <item ref="P190" via="IO191"/>
         <resource ref="P195"/>
-        <resource ref="P196"/>
         <attribute name="Invest" type="double" value="250000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A189" label="Load RF010" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO192" item="P190"/>
           <item ref="P190" via="IO192"/>
+          <resource ref="P196"/>
           <resource ref="P197"/>
         </activity>
         <activity id="A198" label="Apply adhesive RF010-1" time="29" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
@@ -631,13 +631,13 @@
         <item ref="P193" via="IO208"/>
         <item ref="P207" via="IO210"/>
         <resource ref="P214"/>
-        <resource ref="P215"/>
         <attribute name="Invest" type="double" value="251000"/>
         <attribute name="Shift" type="long" value="2"/>
         <activity id="A206" label="Load RF020" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO209" item="P193"/>
           <input id="IO211" item="P207"/>
           <item ref="P207" via="IO211"/>
+          <resource ref="P215"/>
         </activity>
         <activity id="A216" label="Stud weld RF020-1" time="27" type="BIWActivityStudWelding" x="62.5" y="12.5">
           <resource ref="P217"/>
@@ -665,7 +665,6 @@
         <item ref="P228" via="IO232"/>
         <item ref="P229" via="IO234"/>
         <resource ref="P238"/>
-        <resource ref="P239"/>
         <attribute name="Invest" type="double" value="252000"/>
         <attribute name="Shift" type="long" value="3"/>
         <activity id="A227" label="Load RF030" time="8" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -674,6 +673,7 @@
           <input id="IO235" item="P229"/>
           <item ref="P228" via="IO233"/>
           <item ref="P229" via="IO235"/>
+          <resource ref="P239"/>
         </activity>
         <activity id="A240" label="Apply adhesive RF030-1" time="18" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
           <resource ref="P241"/>
@@ -701,7 +701,6 @@
         <item ref="P252" via="IO256"/>
         <item ref="P253" via="IO258"/>
         <resource ref="P262"/>
-        <resource ref="P263"/>
         <attribute name="Invest" type="double" value="253000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A251" label="Load RF040" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -710,6 +709,7 @@
           <input id="IO259" item="P253"/>
           <item ref="P252" via="IO257"/>
           <item ref="P253" via="IO259"/>
+          <resource ref="P263"/>
           <resource ref="P264"/>
         </activity>
         <activity id="A265" label="Arc weld RF040-1" time="10" type="BIWActivityArcWelding" x="62.5" y="12.5">
@@ -726,13 +726,13 @@
         <item ref="P260" via="IO272"/>
         <item ref="P271" via="IO274"/>
         <resource ref="P278"/>
-        <resource ref="P279"/>
         <attribute name="Invest" type="double" value="254000"/>
         <attribute name="Shift" type="long" value="2"/>
         <activity id="A270" label="Load RF050" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO273" item="P260"/>
           <input id="IO275" item="P271"/>
           <item ref="P271" via="IO275"/>
+          <resource ref="P279"/>
         </activity>
         <activity id="A280" label="Spot weld RF050-1" time="29" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <output id="IO283" item="P276"/>
@@ -750,7 +750,6 @@
         <item ref="P286" via="IO290"/>
         <item ref="P287" via="IO292"/>
         <resource ref="P296"/>
-        <resource ref="P297"/>
         <attribute name="Invest" type="double" value="255000"/>
         <attribute name="Shift" type="long" value="3"/>
         <activity id="A285" label="Load RF060" time="9" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -759,6 +758,7 @@
           <input id="IO293" item="P287"/>
           <item ref="P286" via="IO291"/>
           <item ref="P287" via="IO293"/>
+          <resource ref="P297"/>
         </activity>
         <activity id="A298" label="Clinch RF060-1" time="21" type="BIWActivityClinching" x="62.5" y="12.5">
           <resource ref="P299"/>
@@ -781,7 +781,6 @@
         <item ref="P307" via="IO311"/>
         <item ref="P308" via="IO313"/>
         <resource ref="P317"/>
-        <resource ref="P318"/>
         <attribute name="Invest" type="double" value="256000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A306" label="Load RF070" time="13" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -790,6 +789,7 @@
           <input id="IO314" item="P308"/>
           <item ref="P307" via="IO312"/>
           <item ref="P308" via="IO314"/>
+          <resource ref="P318"/>
           <resource ref="P319"/>
         </activity>
         <activity id="A320" label="Apply sealant RF070-1" time="22" type="BIWActivitySealantApplication" x="62.5" y="12.5">
@@ -811,7 +811,6 @@
         <item ref="P315" via="IO330"/>
         <item ref="P329" via="IO332"/>
         <resource ref="P336"/>
-        <resource ref="P337"/>
         <item ref="M345"/>
         <resource ref="P346"/>
         <attribute name="Invest" type="double" value="257000"/>
@@ -820,6 +819,7 @@
           <input id="IO331" item="P315"/>
           <input id="IO333" item="P329"/>
           <item ref="P329" via="IO333"/>
+          <resource ref="P337"/>
         </activity>
         <activity id="A338" label="Spot weld RF080-1" time="20" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <resource ref="P339"/>
@@ -838,12 +838,12 @@
         <output id="IO353" item="P352"/>
         <item ref="P349" via="IO350"/>
         <resource ref="P354"/>
-        <resource ref="P355"/>
         <attribute name="Invest" type="double" value="250000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A348" label="Load EC010" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO351" item="P349"/>
           <item ref="P349" via="IO351"/>
+          <resource ref="P355"/>
           <resource ref="P356"/>
         </activity>
         <activity id="A357" label="Spot weld EC010-1" time="10" type="BIWActivitySpotWelding" x="62.5" y="12.5">
@@ -862,7 +862,6 @@
         <item ref="P363" via="IO367"/>
         <item ref="P364" via="IO369"/>
         <resource ref="P373"/>
-        <resource ref="P374"/>
         <attribute name="Invest" type="double" value="251000"/>
         <attribute name="Shift" type="long" value="2"/>
         <activity id="A362" label="Load EC020" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -871,6 +870,7 @@
           <input id="IO370" item="P364"/>
           <item ref="P363" via="IO368"/>
           <item ref="P364" via="IO370"/>
+          <resource ref="P374"/>
         </activity>
         <activity id="A375" label="Spot glue EC020-1" time="20" type="BIWActivitySpotGluing" x="62.5" y="12.5">
           <resource ref="P376"/>
@@ -898,7 +898,6 @@
         <item ref="P387" via="IO391"/>
         <item ref="P388" via="IO393"/>
         <resource ref="P397"/>
-        <resource ref="P398"/>
         <attribute name="Invest" type="double" value="252000"/>
         <attribute name="Shift" type="long" value="3"/>
         <activity id="A386" label="Load EC030" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -907,6 +906,7 @@
           <input id="IO394" item="P388"/>
           <item ref="P387" via="IO392"/>
           <item ref="P388" via="IO394"/>
+          <resource ref="P398"/>
         </activity>
         <activity id="A399" label="Spot weld EC030-1" time="23" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <output id="IO402" item="P395"/>
@@ -922,13 +922,13 @@
         <item ref="P395" via="IO406"/>
         <item ref="P405" via="IO408"/>
         <resource ref="P412"/>
-        <resource ref="P413"/>
         <attribute name="Invest" type="double" value="253000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A404" label="Load EC040" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO407" item="P395"/>
           <input id="IO409" item="P405"/>
           <item ref="P405" via="IO409"/>
+          <resource ref="P413"/>
           <resource ref="P414"/>
         </activity>
         <activity id="A415" label="Arc weld EC040-1" time="16" type="BIWActivityArcWelding" x="62.5" y="12.5">
@@ -950,13 +950,13 @@
         <item ref="P410" via="IO425"/>
         <item ref="P424" via="IO427"/>
         <resource ref="P431"/>
-        <resource ref="P432"/>
         <attribute name="Invest" type="double" value="254000"/>
         <attribute name="Shift" type="long" value="2"/>
         <activity id="A423" label="Load EC050" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO426" item="P410"/>
           <input id="IO428" item="P424"/>
           <item ref="P424" via="IO428"/>
+          <resource ref="P432"/>
         </activity>
         <activity id="A433" label="Spot glue EC050-1" time="25" type="BIWActivitySpotGluing" x="62.5" y="12.5">
           <resource ref="P434"/>
@@ -979,7 +979,6 @@
         <item ref="P442" via="IO446"/>
         <item ref="P443" via="IO448"/>
         <resource ref="P452"/>
-        <resource ref="P453"/>
         <attribute name="Invest" type="double" value="255000"/>
         <attribute name="Shift" type="long" value="3"/>
         <activity id="A441" label="Load EC060" time="8" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -988,6 +987,7 @@
           <input id="IO449" item="P443"/>
           <item ref="P442" via="IO447"/>
           <item ref="P443" via="IO449"/>
+          <resource ref="P453"/>
         </activity>
         <activity id="A454" label="Stud weld EC060-1" time="23" type="BIWActivityStudWelding" x="62.5" y="12.5">
           <resource ref="P455"/>
@@ -1013,13 +1013,13 @@
         <item ref="P450" via="IO467"/>
         <item ref="P466" via="IO469"/>
         <resource ref="P473"/>
-        <resource ref="P474"/>
         <attribute name="Invest" type="double" value="256000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A465" label="Load EC070" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO468" item="P450"/>
           <input id="IO470" item="P466"/>
           <item ref="P466" via="IO470"/>
+          <resource ref="P474"/>
           <resource ref="P475"/>
         </activity>
         <activity id="A476" label="Spot weld EC070-1" time="18" type="BIWActivitySpotWelding" x="62.5" y="12.5">
@@ -1036,7 +1036,6 @@
         <item ref="P471" via="IO483"/>
         <item ref="P482" via="IO485"/>
         <resource ref="P489"/>
-        <resource ref="P490"/>
         <item ref="M498"/>
         <resource ref="P499"/>
         <attribute name="Invest" type="double" value="257000"/>
@@ -1045,6 +1044,7 @@
           <input id="IO484" item="P471"/>
           <input id="IO486" item="P482"/>
           <item ref="P482" via="IO486"/>
+          <resource ref="P490"/>
         </activity>
         <activity id="A491" label="Stud weld EC080-1" time="21" type="BIWActivityStudWelding" x="62.5" y="12.5">
           <resource ref="P492"/>
@@ -1069,7 +1069,6 @@
         <item ref="P487" via="IO507"/>
         <item ref="P502" via="IO509"/>
         <resource ref="P513"/>
-        <resource ref="P514"/>
         <attribute name="Invest" type="double" value="250000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A501" label="Load UB010" time="13" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -1078,6 +1077,7 @@
           <input id="IO508" item="P487"/>
           <input id="IO510" item="P502"/>
           <item ref="P502" via="IO510"/>
+          <resource ref="P514"/>
           <resource ref="P515"/>
         </activity>
         <activity id="A516" label="Apply adhesive UB010-1" time="28" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
@@ -1094,13 +1094,13 @@
         <item ref="P511" via="IO523"/>
         <item ref="P522" via="IO525"/>
         <resource ref="P529"/>
-        <resource ref="P530"/>
         <attribute name="Invest" type="double" value="251000"/>
         <attribute name="Shift" type="long" value="2"/>
         <activity id="A521" label="Load UB020" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO524" item="P511"/>
           <input id="IO526" item="P522"/>
           <item ref="P522" via="IO526"/>
+          <resource ref="P530"/>
         </activity>
         <activity id="A531" label="Apply adhesive UB020-1" time="19" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
           <resource ref="P532"/>
@@ -1128,7 +1128,6 @@
         <item ref="P543" via="IO547"/>
         <item ref="P544" via="IO549"/>
         <resource ref="P553"/>
-        <resource ref="P554"/>
         <attribute name="Invest" type="double" value="252000"/>
         <attribute name="Shift" type="long" value="3"/>
         <activity id="A542" label="Load UB030" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -1137,6 +1136,7 @@
           <input id="IO550" item="P544"/>
           <item ref="P543" via="IO548"/>
           <item ref="P544" via="IO550"/>
+          <resource ref="P554"/>
         </activity>
         <activity id="A555" label="Spot weld UB030-1" time="22" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <resource ref="P556"/>
@@ -1162,13 +1162,13 @@
         <item ref="P551" via="IO568"/>
         <item ref="P567" via="IO570"/>
         <resource ref="P574"/>
-        <resource ref="P575"/>
         <attribute name="Invest" type="double" value="253000"/>
         <attribute name="Shift" type="long" value="1"/>
         <activity id="A566" label="Load UB040" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO569" item="P551"/>
           <input id="IO571" item="P567"/>
           <item ref="P567" via="IO571"/>
+          <resource ref="P575"/>
           <resource ref="P576"/>
         </activity>
         <activity id="A577" label="Spot glue UB040-1" time="25" type="BIWActivitySpotGluing" x="62.5" y="12.5">
@@ -1185,7 +1185,6 @@
         <item ref="P572" via="IO584"/>
         <item ref="P583" via="IO586"/>
         <resource ref="P590"/>
-        <resource ref="P591"/>
         <resource ref="P599"/>
         <attribute name="Invest" type="double" value="254000"/>
         <attribute name="Shift" type="long" value="2"/>
@@ -1193,6 +1192,7 @@
           <input id="IO585" item="P572"/>
           <input id="IO587" item="P583"/>
           <item ref="P583" via="IO587"/>
+          <resource ref="P591"/>
         </activity>
         <activity id="A592" label="Apply adhesive UB050-1" time="28" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
           <resource ref="P593"/>
@@ -1213,13 +1213,13 @@
         <item ref="P588" via="IO603"/>
         <item ref="P602" via="IO605"/>
         <resource ref="P609"/>
-        <resource ref="P610"/>
         <attribute name="Invest" type="double" value="255000"/>
         <attribute name="Shift" type="long" value="3"/>
         <activity id="A601" label="Load UB060" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO604" item="P588"/>
           <input id="IO606" item="P602"/>
           <item ref="P602" via="IO606"/>
+          <resource ref="P610"/>
         </activity>
         <activity id="A611" label="Clinch UB060-1" time="27" type="BIWActivityClinching" x="62.5" y="12.5">
           <resource ref="P612"/>
@@ -1248,13 +1248,13 @@
           <item ref="P607" via="IO657"/>
           <item ref="P623" via="IO658"/>
           <resource ref="P630"/>
-          <resource ref="P631"/>
           <attribute name="Invest" type="double" value="256000"/>
           <attribute name="Shift" type="long" value="1"/>
           <activity id="A660" label="Load UB070" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
             <input id="IO661" item="P607"/>
             <input id="IO662" item="P623"/>
             <item ref="P623" via="IO662"/>
+            <resource ref="P631"/>
             <resource ref="P632"/>
           </activity>
           <activity id="A663" label="Clinch UB070-1" time="11" type="BIWActivityClinching" x="62.5" y="12.5">
@@ -1276,13 +1276,13 @@
           <item ref="P628" via="IO667"/>
           <item ref="P642" via="IO668"/>
           <resource ref="P649"/>
-          <resource ref="P650"/>
           <attribute name="Invest" type="double" value="257000"/>
           <attribute name="Shift" type="long" value="2"/>
           <activity id="A670" label="Load UB080" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
             <input id="IO671" item="P628"/>
             <input id="IO672" item="P642"/>
             <item ref="P642" via="IO672"/>
+            <resource ref="P650"/>
           </activity>
           <activity id="A673" label="Spot glue UB080-1" time="15" type="BIWActivitySpotGluing" x="62.5" y="12.5">
             <output id="IO674" item="P647"/>

@@ -353,12 +353,12 @@
         <item ref="P9" via="IO11"/>
         <item ref="P10" via="IO13"/>
         <resource ref="P17"/>
-        <resource ref="P18"/>
         <activity id="A8" label="Load FF010" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO12" item="P9"/>
           <input id="IO14" item="P10"/>
           <item ref="P9" via="IO12"/>
           <item ref="P10" via="IO14"/>
+          <resource ref="P18"/>
           <resource ref="P19"/>
         </activity>
         <activity id="A20" label="Clinch FF010-1" time="26" type="BIWActivityClinching" x="62.5" y="12.5">
@@ -387,13 +387,13 @@
         <item ref="P32" via="IO36"/>
         <item ref="P33" via="IO38"/>
         <resource ref="P42"/>
-        <resource ref="P43"/>
         <activity id="A31" label="Load FF020" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO35" item="P15"/>
           <input id="IO37" item="P32"/>
           <input id="IO39" item="P33"/>
           <item ref="P32" via="IO37"/>
           <item ref="P33" via="IO39"/>
+          <resource ref="P43"/>
         </activity>
         <activity id="A44" label="Stud weld FF020-1" time="21" type="BIWActivityStudWelding" x="62.5" y="12.5">
           <resource ref="P45"/>
@@ -419,11 +419,11 @@
         <item ref="P40" via="IO57"/>
         <item ref="P56" via="IO59"/>
         <resource ref="P63"/>
-        <resource ref="P64"/>
         <activity id="A55" label="Load FF030" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO58" item="P40"/>
           <input id="IO60" item="P56"/>
           <item ref="P56" via="IO60"/>
+          <resource ref="P64"/>
         </activity>
         <activity id="A65" label="Spot weld FF030-1" time="15" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <resource ref="P66"/>
@@ -449,11 +449,11 @@
         <item ref="P61" via="IO78"/>
         <item ref="P77" via="IO80"/>
         <resource ref="P84"/>
-        <resource ref="P85"/>
         <activity id="A76" label="Load FF040" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO79" item="P61"/>
           <input id="IO81" item="P77"/>
           <item ref="P77" via="IO81"/>
+          <resource ref="P85"/>
           <resource ref="P86"/>
         </activity>
         <activity id="A87" label="Arc weld FF040-1" time="29" type="BIWActivityArcWelding" x="62.5" y="12.5">
@@ -477,13 +477,13 @@
         <item ref="P96" via="IO100"/>
         <item ref="P97" via="IO102"/>
         <resource ref="P106"/>
-        <resource ref="P107"/>
         <activity id="A95" label="Load FF050" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO99" item="P82"/>
           <input id="IO101" item="P96"/>
           <input id="IO103" item="P97"/>
           <item ref="P96" via="IO101"/>
           <item ref="P97" via="IO103"/>
+          <resource ref="P107"/>
         </activity>
         <activity id="A108" label="Spot weld FF050-1" time="19" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <output id="IO111" item="P104"/>
@@ -499,11 +499,11 @@
         <item ref="P104" via="IO115"/>
         <item ref="P114" via="IO117"/>
         <resource ref="P121"/>
-        <resource ref="P122"/>
         <activity id="A113" label="Load FF060" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO116" item="P104"/>
           <input id="IO118" item="P114"/>
           <item ref="P114" via="IO118"/>
+          <resource ref="P122"/>
         </activity>
         <activity id="A123" label="Spot weld FF060-1" time="17" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <output id="IO126" item="P119"/>
@@ -521,13 +521,13 @@
         <item ref="P129" via="IO133"/>
         <item ref="P130" via="IO135"/>
         <resource ref="P139"/>
-        <resource ref="P140"/>
         <activity id="A128" label="Load FF070" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO132" item="P119"/>
           <input id="IO134" item="P129"/>
           <input id="IO136" item="P130"/>
           <item ref="P129" via="IO134"/>
           <item ref="P130" via="IO136"/>
+          <resource ref="P140"/>
           <resource ref="P141"/>
         </activity>
         <activity id="A142" label="Apply sealant FF070-1" time="12" type="BIWActivitySealantApplication" x="62.5" y="12.5">
@@ -556,7 +556,6 @@
         <item ref="P154" via="IO158"/>
         <item ref="P155" via="IO160"/>
         <resource ref="P164"/>
-        <resource ref="P165"/>
         <item ref="M176"/>
         <resource ref="P177"/>
         <activity id="A153" label="Load FF080" time="9" type="BIWActivityLoading" x="12.5" y="12.5">
@@ -565,6 +564,7 @@
           <input id="IO161" item="P155"/>
           <item ref="P154" via="IO159"/>
           <item ref="P155" via="IO161"/>
+          <resource ref="P165"/>
         </activity>
         <activity id="A166" label="Clinch FF080-1" time="26" type="BIWActivityClinching" x="62.5" y="12.5">
           <resource ref="P167"/>
@@ -588,10 +588,10 @@
         <output id="IO184" item="P183"/>
         <item ref="P180" via="IO181"/>
         <resource ref="P185"/>
-        <resource ref="P186"/>
         <activity id="A179" label="Load RF010" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO182" item="P180"/>
           <item ref="P180" via="IO182"/>
+          <resource ref="P186"/>
           <resource ref="P187"/>
         </activity>
         <activity id="A188" label="Apply adhesive RF010-1" time="29" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
@@ -613,11 +613,11 @@
         <item ref="P183" via="IO198"/>
         <item ref="P197" via="IO200"/>
         <resource ref="P204"/>
-        <resource ref="P205"/>
         <activity id="A196" label="Load RF020" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO199" item="P183"/>
           <input id="IO201" item="P197"/>
           <item ref="P197" via="IO201"/>
+          <resource ref="P205"/>
         </activity>
         <activity id="A206" label="Stud weld RF020-1" time="27" type="BIWActivityStudWelding" x="62.5" y="12.5">
           <resource ref="P207"/>
@@ -645,13 +645,13 @@
         <item ref="P218" via="IO222"/>
         <item ref="P219" via="IO224"/>
         <resource ref="P228"/>
-        <resource ref="P229"/>
         <activity id="A217" label="Load RF030" time="8" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO221" item="P202"/>
           <input id="IO223" item="P218"/>
           <input id="IO225" item="P219"/>
           <item ref="P218" via="IO223"/>
           <item ref="P219" via="IO225"/>
+          <resource ref="P229"/>
         </activity>
         <activity id="A230" label="Apply adhesive RF030-1" time="18" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
           <resource ref="P231"/>
@@ -679,13 +679,13 @@
         <item ref="P242" via="IO246"/>
         <item ref="P243" via="IO248"/>
         <resource ref="P252"/>
-        <resource ref="P253"/>
         <activity id="A241" label="Load RF040" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO245" item="P226"/>
           <input id="IO247" item="P242"/>
           <input id="IO249" item="P243"/>
           <item ref="P242" via="IO247"/>
           <item ref="P243" via="IO249"/>
+          <resource ref="P253"/>
           <resource ref="P254"/>
         </activity>
         <activity id="A255" label="Arc weld RF040-1" time="10" type="BIWActivityArcWelding" x="62.5" y="12.5">
@@ -702,11 +702,11 @@
         <item ref="P250" via="IO262"/>
         <item ref="P261" via="IO264"/>
         <resource ref="P268"/>
-        <resource ref="P269"/>
         <activity id="A260" label="Load RF050" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO263" item="P250"/>
           <input id="IO265" item="P261"/>
           <item ref="P261" via="IO265"/>
+          <resource ref="P269"/>
         </activity>
         <activity id="A270" label="Spot weld RF050-1" time="29" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <output id="IO273" item="P266"/>
@@ -724,13 +724,13 @@
         <item ref="P276" via="IO280"/>
         <item ref="P277" via="IO282"/>
         <resource ref="P286"/>
-        <resource ref="P287"/>
         <activity id="A275" label="Load RF060" time="9" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO279" item="P266"/>
           <input id="IO281" item="P276"/>
           <input id="IO283" item="P277"/>
           <item ref="P276" via="IO281"/>
           <item ref="P277" via="IO283"/>
+          <resource ref="P287"/>
         </activity>
         <activity id="A288" label="Clinch RF060-1" time="21" type="BIWActivityClinching" x="62.5" y="12.5">
           <resource ref="P289"/>
@@ -753,13 +753,13 @@
         <item ref="P297" via="IO301"/>
         <item ref="P298" via="IO303"/>
         <resource ref="P307"/>
-        <resource ref="P308"/>
         <activity id="A296" label="Load RF070" time="13" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO300" item="P284"/>
           <input id="IO302" item="P297"/>
           <input id="IO304" item="P298"/>
           <item ref="P297" via="IO302"/>
           <item ref="P298" via="IO304"/>
+          <resource ref="P308"/>
           <resource ref="P309"/>
         </activity>
         <activity id="A310" label="Apply sealant RF070-1" time="22" type="BIWActivitySealantApplication" x="62.5" y="12.5">
@@ -781,13 +781,13 @@
         <item ref="P305" via="IO320"/>
         <item ref="P319" via="IO322"/>
         <resource ref="P326"/>
-        <resource ref="P327"/>
         <item ref="M335"/>
         <resource ref="P336"/>
         <activity id="A318" label="Load RF080" time="13" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO321" item="P305"/>
           <input id="IO323" item="P319"/>
           <item ref="P319" via="IO323"/>
+          <resource ref="P327"/>
         </activity>
         <activity id="A328" label="Spot weld RF080-1" time="20" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <resource ref="P329"/>
@@ -806,10 +806,10 @@
         <output id="IO343" item="P342"/>
         <item ref="P339" via="IO340"/>
         <resource ref="P344"/>
-        <resource ref="P345"/>
         <activity id="A338" label="Load EC010" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO341" item="P339"/>
           <item ref="P339" via="IO341"/>
+          <resource ref="P345"/>
           <resource ref="P346"/>
         </activity>
         <activity id="A347" label="Spot weld EC010-1" time="10" type="BIWActivitySpotWelding" x="62.5" y="12.5">
@@ -828,13 +828,13 @@
         <item ref="P353" via="IO357"/>
         <item ref="P354" via="IO359"/>
         <resource ref="P363"/>
-        <resource ref="P364"/>
         <activity id="A352" label="Load EC020" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO356" item="P342"/>
           <input id="IO358" item="P353"/>
           <input id="IO360" item="P354"/>
           <item ref="P353" via="IO358"/>
           <item ref="P354" via="IO360"/>
+          <resource ref="P364"/>
         </activity>
         <activity id="A365" label="Spot glue EC020-1" time="20" type="BIWActivitySpotGluing" x="62.5" y="12.5">
           <resource ref="P366"/>
@@ -862,13 +862,13 @@
         <item ref="P377" via="IO381"/>
         <item ref="P378" via="IO383"/>
         <resource ref="P387"/>
-        <resource ref="P388"/>
         <activity id="A376" label="Load EC030" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO380" item="P361"/>
           <input id="IO382" item="P377"/>
           <input id="IO384" item="P378"/>
           <item ref="P377" via="IO382"/>
           <item ref="P378" via="IO384"/>
+          <resource ref="P388"/>
         </activity>
         <activity id="A389" label="Spot weld EC030-1" time="23" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <output id="IO392" item="P385"/>
@@ -884,11 +884,11 @@
         <item ref="P385" via="IO396"/>
         <item ref="P395" via="IO398"/>
         <resource ref="P402"/>
-        <resource ref="P403"/>
         <activity id="A394" label="Load EC040" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO397" item="P385"/>
           <input id="IO399" item="P395"/>
           <item ref="P395" via="IO399"/>
+          <resource ref="P403"/>
           <resource ref="P404"/>
         </activity>
         <activity id="A405" label="Arc weld EC040-1" time="16" type="BIWActivityArcWelding" x="62.5" y="12.5">
@@ -910,11 +910,11 @@
         <item ref="P400" via="IO415"/>
         <item ref="P414" via="IO417"/>
         <resource ref="P421"/>
-        <resource ref="P422"/>
         <activity id="A413" label="Load EC050" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO416" item="P400"/>
           <input id="IO418" item="P414"/>
           <item ref="P414" via="IO418"/>
+          <resource ref="P422"/>
         </activity>
         <activity id="A423" label="Spot glue EC050-1" time="25" type="BIWActivitySpotGluing" x="62.5" y="12.5">
           <resource ref="P424"/>
@@ -937,13 +937,13 @@
         <item ref="P432" via="IO436"/>
         <item ref="P433" via="IO438"/>
         <resource ref="P442"/>
-        <resource ref="P443"/>
         <activity id="A431" label="Load EC060" time="8" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO435" item="P419"/>
           <input id="IO437" item="P432"/>
           <input id="IO439" item="P433"/>
           <item ref="P432" via="IO437"/>
           <item ref="P433" via="IO439"/>
+          <resource ref="P443"/>
         </activity>
         <activity id="A444" label="Stud weld EC060-1" time="23" type="BIWActivityStudWelding" x="62.5" y="12.5">
           <resource ref="P445"/>
@@ -969,11 +969,11 @@
         <item ref="P440" via="IO457"/>
         <item ref="P456" via="IO459"/>
         <resource ref="P463"/>
-        <resource ref="P464"/>
         <activity id="A455" label="Load EC070" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO458" item="P440"/>
           <input id="IO460" item="P456"/>
           <item ref="P456" via="IO460"/>
+          <resource ref="P464"/>
           <resource ref="P465"/>
         </activity>
         <activity id="A466" label="Spot weld EC070-1" time="18" type="BIWActivitySpotWelding" x="62.5" y="12.5">
@@ -990,13 +990,13 @@
         <item ref="P461" via="IO473"/>
         <item ref="P472" via="IO475"/>
         <resource ref="P479"/>
-        <resource ref="P480"/>
         <item ref="M488"/>
         <resource ref="P489"/>
         <activity id="A471" label="Load EC080" time="8" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO474" item="P461"/>
           <input id="IO476" item="P472"/>
           <item ref="P472" via="IO476"/>
+          <resource ref="P480"/>
         </activity>
         <activity id="A481" label="Stud weld EC080-1" time="21" type="BIWActivityStudWelding" x="62.5" y="12.5">
           <resource ref="P482"/>
@@ -1021,13 +1021,13 @@
         <item ref="P477" via="IO497"/>
         <item ref="P492" via="IO499"/>
         <resource ref="P503"/>
-        <resource ref="P504"/>
         <activity id="A491" label="Load UB010" time="13" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO494" item="P162"/>
           <input id="IO496" item="P324"/>
           <input id="IO498" item="P477"/>
           <input id="IO500" item="P492"/>
           <item ref="P492" via="IO500"/>
+          <resource ref="P504"/>
           <resource ref="P505"/>
         </activity>
         <activity id="A506" label="Apply adhesive UB010-1" time="28" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
@@ -1044,11 +1044,11 @@
         <item ref="P501" via="IO513"/>
         <item ref="P512" via="IO515"/>
         <resource ref="P519"/>
-        <resource ref="P520"/>
         <activity id="A511" label="Load UB020" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO514" item="P501"/>
           <input id="IO516" item="P512"/>
           <item ref="P512" via="IO516"/>
+          <resource ref="P520"/>
         </activity>
         <activity id="A521" label="Apply adhesive UB020-1" time="19" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
           <resource ref="P522"/>
@@ -1076,13 +1076,13 @@
         <item ref="P533" via="IO537"/>
         <item ref="P534" via="IO539"/>
         <resource ref="P543"/>
-        <resource ref="P544"/>
         <activity id="A532" label="Load UB030" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO536" item="P517"/>
           <input id="IO538" item="P533"/>
           <input id="IO540" item="P534"/>
           <item ref="P533" via="IO538"/>
           <item ref="P534" via="IO540"/>
+          <resource ref="P544"/>
         </activity>
         <activity id="A545" label="Spot weld UB030-1" time="22" type="BIWActivitySpotWelding" x="62.5" y="12.5">
           <resource ref="P546"/>
@@ -1108,11 +1108,11 @@
         <item ref="P541" via="IO558"/>
         <item ref="P557" via="IO560"/>
         <resource ref="P564"/>
-        <resource ref="P565"/>
         <activity id="A556" label="Load UB040" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO559" item="P541"/>
           <input id="IO561" item="P557"/>
           <item ref="P557" via="IO561"/>
+          <resource ref="P565"/>
           <resource ref="P566"/>
         </activity>
         <activity id="A567" label="Spot glue UB040-1" time="25" type="BIWActivitySpotGluing" x="62.5" y="12.5">
@@ -1129,12 +1129,12 @@
         <item ref="P562" via="IO574"/>
         <item ref="P573" via="IO576"/>
         <resource ref="P580"/>
-        <resource ref="P581"/>
         <resource ref="P589"/>
         <activity id="A572" label="Load UB050" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO575" item="P562"/>
           <input id="IO577" item="P573"/>
           <item ref="P573" via="IO577"/>
+          <resource ref="P581"/>
         </activity>
         <activity id="A582" label="Apply adhesive UB050-1" time="28" type="BIWActivityAdhesiveApplication" x="62.5" y="12.5">
           <resource ref="P583"/>
@@ -1155,11 +1155,11 @@
         <item ref="P578" via="IO593"/>
         <item ref="P592" via="IO595"/>
         <resource ref="P599"/>
-        <resource ref="P600"/>
         <activity id="A591" label="Load UB060" time="11" type="BIWActivityLoading" x="12.5" y="12.5">
           <input id="IO594" item="P578"/>
           <input id="IO596" item="P592"/>
           <item ref="P592" via="IO596"/>
+          <resource ref="P600"/>
         </activity>
         <activity id="A601" label="Clinch UB060-1" time="27" type="BIWActivityClinching" x="62.5" y="12.5">
           <resource ref="P602"/>
@@ -1188,11 +1188,11 @@
           <item ref="P597" via="IO647"/>
           <item ref="P613" via="IO648"/>
           <resource ref="P620"/>
-          <resource ref="P621"/>
           <activity id="A650" label="Load UB070" time="10" type="BIWActivityLoading" x="12.5" y="12.5">
             <input id="IO651" item="P597"/>
             <input id="IO652" item="P613"/>
             <item ref="P613" via="IO652"/>
+            <resource ref="P621"/>
             <resource ref="P622"/>
           </activity>
           <activity id="A653" label="Clinch UB070-1" time="11" type="BIWActivityClinching" x="62.5" y="12.5">
@@ -1214,11 +1214,11 @@
           <item ref="P618" via="IO657"/>
           <item ref="P632" via="IO658"/>
           <resource ref="P639"/>
-          <resource ref="P640"/>
           <activity id="A660" label="Load UB080" time="12" type="BIWActivityLoading" x="12.5" y="12.5">
             <input id="IO661" item="P618"/>
             <input id="IO662" item="P632"/>
             <item ref="P632" via="IO662"/>
+            <resource ref="P640"/>
           </activity>
           <activity id="A663" label="Spot glue UB080-1" time="15" type="BIWActivitySpotGluing" x="62.5" y="12.5">
             <output id="IO664" item="P637"/>

@@ -269,6 +269,7 @@ TEST(SampleTest, TheUnderbodySampleHasTheShapeOfARealLine) {
   VORListValVORBaseUnknown_var* top = nullptr;
   VORISPPChildManagement_var(doc->GetRootProcess())->GetChildren(top, "Activity");
   int stations = 0, merges = 0, groupings = 0;
+  VORBaseUnknown_var stationFather;
   for (const VORBaseUnknown_var& a : *top) {
     VORListValVORBaseUnknown_var* list = nullptr;
     VORISPPFlowMgt_var(a)->GetPreviousActivities(list, "Activity");
@@ -283,6 +284,16 @@ TEST(SampleTest, TheUnderbodySampleHasTheShapeOfARealLine) {
       delete list;
       children->GetChildren(list, "PhysicalActivity");
       EXPECT_GE(list->Size(), 2) << "loading and at least one joining";
+      delete list;
+      // Stations can be grouped: their resources hang under one father product.
+      VORISPPResourceManagement_var(a)->GetResources(list, "Resource");
+      for (const VORBaseUnknown_var& r : *list) {
+        VORBaseUnknown_var father;
+        VORIProduct_var(r)->GetFatherProduct(father);
+        if (!stationFather)
+          stationFather = father;
+        EXPECT_EQ(father, stationFather) << IdOf(a.get());
+      }
       delete list;
     } else if (type == "BIWActivityGrouping") {
       ++groupings;

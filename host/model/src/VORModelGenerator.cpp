@@ -226,7 +226,7 @@ class Builder {
     VORBaseUnknown_var fixture;
     _door.CreateProduct(stationResource, name + " fixture", fixture);
     MakeResource(fixture, "Fixture", "Fixture");
-    _door.AssignResource(station, fixture);
+    _door.AssignResource(loading, fixture);  // the station itself keeps one level of resources
     if (index % 3 == 0) {
       VORBaseUnknown_var worker;
       _door.CreateProduct(stationResource, name + " operator", worker);
