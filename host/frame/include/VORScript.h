@@ -4,6 +4,7 @@
 // the script with "line N: error: reason". The language is described in docs/scripting.md.
 #pragma once
 
+#include <functional>
 #include <ostream>
 #include <string>
 #include <vector>
@@ -19,6 +20,13 @@ class VORScript {
   bool RunFile(const std::string& path);
   // Splits a line into words (quotes, ${NAME}); false and a reason for an unclosed quote.
   static bool Split(const std::string& line, std::vector<std::string>& words, std::string& error);
+
+  // Steps added by modules when they load (for example "zitblts <node>"): the words of the line
+  // (the step first); false with a reason in error. A later registration replaces an earlier.
+  using StepFunction = std::function<bool(VORDriver& driver, const std::vector<std::string>& words,
+                                          std::ostream& out, std::string& error)>;
+  static void RegisterStep(const std::string& step, StepFunction function);
+  static void UnregisterStep(const std::string& step);
 
  private:
   bool Execute(const std::vector<std::string>& words, std::string& error);

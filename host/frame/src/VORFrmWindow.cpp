@@ -8,6 +8,7 @@
 #include "VORCommandEngine.h"
 #include "VORDeferredDeletion.h"
 #include "VORDocument.h"
+#include "VORExtensionRegistry.h"
 #include "VORFrmLayout.h"
 #include "VORFrmPick.h"
 #include "VORFrmWindowKinds.h"
@@ -131,7 +132,10 @@ void VORFrmLayout::RemoveWindow(VORFrmWindow* window) {
 VORApplicationFrame::VORApplicationFrame()
     : _mainWindow(VORHandle<VORFrmMainWindow>::Adopt(new VORFrmMainWindow())),
       _layout(VORFrmLayout_var::Adopt(new VORFrmLayout())),
-      _publisher(VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher(this))) {}
+      _publisher(VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher(this))) {
+  // Modules extend model objects on demand: the dictionary names the module of each extension.
+  VORExtensionRegistry::LoadDictionaryFromStartupPath();
+}
 
 VORApplicationFrame::~VORApplicationFrame() = default;
 

@@ -37,9 +37,22 @@ bool Numbers(const std::vector<std::string>& words, size_t count, std::vector<do
   window = words.size() == expected + 2 ? words[expected + 1] : std::string();
   return true;
 }
+
+std::map<std::string, VORScript::StepFunction>& ModuleSteps() {
+  static std::map<std::string, VORScript::StepFunction> steps;
+  return steps;
+}
 }  // namespace
 
 VORScript::VORScript(VORDriver& driver, std::ostream& out) : _driver(driver), _out(out) {}
+
+void VORScript::RegisterStep(const std::string& step, StepFunction function) {
+  ModuleSteps()[step] = std::move(function);
+}
+
+void VORScript::UnregisterStep(const std::string& step) {
+  ModuleSteps().erase(step);
+}
 
 bool VORScript::Split(const std::string& line, std::vector<std::string>& words,
                       std::string& error) {
@@ -235,6 +248,8 @@ bool VORScript::Execute(const std::vector<std::string>& w, std::string& error) {
     }
     return true;
   }
+  if (auto found = ModuleSteps().find(step); found != ModuleSteps().end())
+    return found->second(_driver, w, _out, error);
   error = "unknown step \"" + step + "\"";
   return false;
 }
