@@ -1,6 +1,7 @@
 // Registers the ZitBlt model's extensions when the module is loaded.
 #include "QELEZitBltCBSubscriber.h"
 #include "QELEZitBltMgr.h"
+#include "QELZitBltScriptStep.h"
 #include "VORExtensionRegistry.h"
 
 extern "C" void VORInitModule() {
@@ -10,4 +11,5 @@ extern "C" void VORInitModule() {
   VORExtensionRegistry::Register(
       "PhysicalActivity", QELIZitBltCBSubscriber::IID(),
       []() -> VORExtension* { return new QELEZitBltCBSubscriber(); }, VORExtensionKind::Data);
+  QELRegisterZitBltScriptStep();
 }
