@@ -17,6 +17,8 @@ class VORQtApplication : public QApplication {
 
   // hook runs after each user event while owner lives.
   void AddAfterEventHook(QObject* owner, std::function<void()> hook);
+  // Drops owner's hooks (an owner going away calls it before it is half destroyed).
+  void RemoveAfterEventHooks(QObject* owner);
   // Drains deferred destruction and runs the hooks now (tests, and after programmatic steps).
   void AfterEvent();
 

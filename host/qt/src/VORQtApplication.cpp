@@ -60,6 +60,13 @@ void VORQtApplication::AddAfterEventHook(QObject* owner, std::function<void()> h
   _hooks.push_back(Hook{owner, std::move(hook)});
 }
 
+void VORQtApplication::RemoveAfterEventHooks(QObject* owner) {
+  for (Hook& hook : _hooks) {
+    if (hook.owner == owner)
+      hook.owner = nullptr;
+  }
+}
+
 void VORQtApplication::AfterEvent() {
   VORDeferredDeletion::Drain();
   if (_inHooks)

@@ -157,6 +157,11 @@ VORQtMainWindow::VORQtMainWindow(QWidget* parent)
 
 VORQtMainWindow::~VORQtMainWindow() {
   VORCommandEngine::GetEventPublisher()->RemoveCallbacksOf(this);
+  if (VORQtApplication* app = VORQtApplication::Instance())
+    app->RemoveAfterEventHooks(this);
+  // Signals of children dying below must not reach this half-destroyed window.
+  _mdi->disconnect(this);
+  _tree->disconnect(this);
   // Widgets showing viewers go before the driver closes the windows that hold them.
   _syncing = true;
   for (auto& [window, entry] : _windows) {
