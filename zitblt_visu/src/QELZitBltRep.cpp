@@ -264,15 +264,17 @@ HRESULT QELZitBltRep::EmptyExpandedBagRep() {
 }
 
 VORNotifPropagation QELZitBltRep::AnalyseNotification(VORCommand* from, VORNotification* notif) {
+  // Forwarding to the father is always explicit: the notification goes no further by itself.
+  constexpr VORNotifPropagation kHandled = VORNotifDontPropagate;
   if (notif == nullptr || _manipulator == nullptr || from != _manipulator)
-    return VORNotifPropagate;
+    return kHandled;
   if (notif == _manipulator->GetVORActivate()) {
     ChangeBtnState();
     SendNotification(GetFather(), notif);
-    return VORNotifPropagate;
+    return kHandled;
   }
   if (notif != _manipulator->GetVORManipulate())
-    return VORNotifPropagate;
+    return kHandled;
 
   VORMathAxis2D axis;
   _manipulator->GetPosition(axis);
@@ -290,16 +292,16 @@ VORNotifPropagation QELZitBltRep::AnalyseNotification(VORCommand* from, VORNotif
     const float cy = static_cast<float>(ty) + dy;
     // A refused step keeps the old drag point: the next step carries the refused distance.
     if (_horizontalLimit && (cx > _maxX || cx < _minX))
-      return VORNotifPropagate;
+      return kHandled;
     if (_verticalLimit && (cy > _maxY || cy < _minY))
-      return VORNotifPropagate;
+      return kHandled;
     SetTranslation(cx, cy);
     ReDraw();
   }
   _lastDragX = px;
   _lastDragY = py;
   SendNotification(GetFather(), notif);
-  return VORNotifPropagate;
+  return kHandled;
 }
 
 VOR_EXPORT_COMMAND_FACTORY_NOARG(QELZitBltRep)

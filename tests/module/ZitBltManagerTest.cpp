@@ -1,0 +1,311 @@
+#include <map>
+
+#include "QELBaseListZitBltCmd.h"
+#include "QELIPertNode.h"
+#include "QELIZitBltCBSubscriber.h"
+#include "QELIZitBltMgr.h"
+#include "QELZitBltRep.h"
+#include "VORDocument.h"
+#include "VORIModelEvents.h"
+#include "VORISPPActivityModificationEvents.h"
+#include "VORModelDoor.h"
+#include "VORModuleLoader.h"
+#include "VORSPPActivityNotification.h"
+#include "VORViewer.h"
+#include "ZitBltTestSupport.h"
+
+namespace {
+
+const char* const kLocations[] = {"lefttop",     "leftmiddle",  "leftbottom",   "righttop",
+                                  "rightmiddle", "rightbottom", "topleft",      "topmiddle",
+                                  "topright",    "bottomleft",  "bottommiddle", "bottomright"};
+
+std::string Config() {
+  auto zitblt = [](const std::string& name, const std::string& location,
+                   const std::string& update = "", const std::string& type = "QELZitBltRep") {
+    std::string s = "<ZitBlt Name=\"" + name + "\" Type=\"" + type +
+                    "\" LoadModule=\"QELZitBltVisu\" Location=\"" + location +
+                    "\" IconFile=\"I_Test\">";
+    if (!update.empty())
+      s += "<UpdateData CmdName=\"" + update + "\" LoadModule=\"QELZitBltTestCmds\"/>";
+    return s + "</ZitBlt>\n";
+  };
+  const std::string cmd = "QELTestListZitBltCmd";
+  std::string xml = "<Config><ActivityZitBlt ActivityType=\"BIWActivityStation\">\n";
+  for (const char* location : kLocations)
+    xml += zitblt(std::string("at-") + location, location);
+  xml += zitblt("centre", "Centre");
+  xml += zitblt("Missing", "lefttop", "", "QELNoSuchRep");
+  xml += zitblt("BIWStationStatusBars", "topmiddle", cmd);
+  xml += zitblt("ProductOutput", "righttop");
+  xml += "</ActivityZitBlt>\n<ActivityZitBlt ActivityType=\"BIWActivityGrouping\">\n";
+  xml += zitblt("BIWStationStatusBars", "topmiddle", cmd);
+  xml += zitblt("BIWGroupingStatusBars", "topright", cmd);
+  xml += zitblt("ProductInput", "lefttop", cmd);
+  xml += "</ActivityZitBlt>\n<ActivityZitBlt ActivityType=\"BIWActivityLoading\">\n";
+  xml += zitblt("BIWStationStatusBars", "topmiddle");
+  return xml + "</ActivityZitBlt></Config>\n";
+}
+
+class ZitBltManagerTest : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    _live = VORBaseUnknown::LiveInstances();
+    ASSERT_NE(VORModuleLoader::LoadModule("QELZitBltModel"), nullptr);
+    startup.WriteIcon("I_Test", 16, 8);
+    startup.WriteConfig(Config());
+    doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
+    root = doc->GetRootProcess();
+    grouping = Node(root, "G", "BIWActivityGrouping", 0, 100);
+    station = Node(grouping, "S", "BIWActivityStation", 0, 0);
+    loading = Node(grouping, "L", "BIWActivityLoading", 50, 0);
+    QELIPertNode_var(station)->SetSize(100, 40);
+    viewer = VORHandle<VORViewer>::Adopt(new VORViewer(nullptr, "v", 0, 800, 500, 0));
+    log = reinterpret_cast<std::vector<std::string>* (*)()>(
+        VORModuleLoader::FindSymbol("QELZitBltTestCmds", "QELTestListZitBltLog"))();
+    log->clear();
+  }
+  void TearDown() override {
+    for (VORBaseUnknown_var* node : {&grouping, &station, &loading})
+      Manager(*node)->RemoveZitBlts();
+    grouping = station = loading = root = NULL_var;
+    doc = NULL_var;
+    viewer = NULL_var;
+    VORDeferredDeletion::Drain();
+    QELZitBltConfiguration::ForgetForTests();
+    QELBaseListZitBltCmd::ForgetStatusBarConfigurationForTests();
+    EXPECT_EQ(VORBaseUnknown::LiveInstances(), _live) << "leaked objects";
+  }
+  VORBaseUnknown_var Node(VORBaseUnknown* father, const char* label, const char* type, double x,
+                          double y) {
+    VORBaseUnknown_var node;
+    EXPECT_EQ(doc->GetDoor().CreateNode(father, type, node), S_OK);
+    doc->GetDoor().SetLabel(node, VORUnicodeString(label));
+    doc->GetDoor().SetPertPosition(node, true, x, y);
+    return node;
+  }
+  static QELIZitBltMgr_var Manager(const VORBaseUnknown_var& node) {
+    QELIZitBltMgr_var manager(node);
+    EXPECT_TRUE(manager);
+    return manager;
+  }
+  static std::vector<std::string> Names(const VORBaseUnknown_var& node) {
+    VORListValVORUnicodeString* names = nullptr;
+    Manager(node)->GetZitBltNames(names);
+    std::vector<std::string> out;
+    for (const VORUnicodeString& n : *names)
+      out.push_back(n.ConvertToUTF8());
+    delete names;
+    return out;
+  }
+  static QELZitBltRep* Rep(const VORBaseUnknown_var& node, const std::string& name) {
+    QELZitBltRep* rep = nullptr;
+    Manager(node)->GetZitBlt(VORUnicodeString(name), &rep);
+    return rep;
+  }
+  static VORMathPoint2D At(const VORBaseUnknown_var& node, const std::string& name) {
+    VORMathPoint2D p{1e9, 1e9};
+    if (QELZitBltRep* rep = Rep(node, name))
+      rep->GetPoDPosition(p.x, p.y);
+    return p;
+  }
+  static void Move(const VORBaseUnknown_var& node, double x, double y) {
+    QELIPertNode_var(node)->SetPosition(x, y);
+  }
+
+  ZitBltStartupDir startup;
+  VORProcess_var doc;
+  VORBaseUnknown_var root, grouping, station, loading;
+  VORHandle<VORViewer> viewer;
+  std::vector<std::string>* log = nullptr;
+  long _live = 0;
+};
+
+TEST_F(ZitBltManagerTest, ZitBltsSitOnTheCornerOrEdgeMidpointNamedByTheirLocation) {
+  ASSERT_EQ(Manager(station)->BuildZitBltReps(viewer), 1);
+  // Configuration order; the class that cannot be loaded is left out.
+  std::vector<std::string> expected;
+  for (const char* location : kLocations)
+    expected.push_back(std::string("at-") + location);
+  expected.insert(expected.end(), {"centre", "BIWStationStatusBars", "ProductOutput"});
+  EXPECT_EQ(Names(station), expected);
+
+  // 100 x 40 node centred at (0, 0).
+  const std::map<std::string, VORMathPoint2D> table = {
+      {"lefttop", {-50, 20}},     {"topleft", {-50, 20}},     {"leftmiddle", {-50, 0}},
+      {"leftbottom", {-50, -20}}, {"bottomleft", {-50, -20}}, {"righttop", {50, 20}},
+      {"topright", {50, 20}},     {"rightmiddle", {50, 0}},   {"rightbottom", {50, -20}},
+      {"bottomright", {50, -20}}, {"topmiddle", {0, 20}},     {"bottommiddle", {0, -20}},
+  };
+  for (const auto& [location, p] : table) {
+    EXPECT_EQ(At(station, "at-" + location).x, p.x) << location;
+    EXPECT_EQ(At(station, "at-" + location).y, p.y) << location;
+    // Both bags carry the translation.
+    double tx = 0, ty = 0;
+    Rep(station, "at-" + location)->GetZitBltExpanded()->GetMatrix()->GetTranslation(tx, ty);
+    EXPECT_EQ(tx, p.x);
+    EXPECT_EQ(ty, p.y);
+  }
+  EXPECT_EQ(At(station, "centre").x, 0.0);
+  EXPECT_EQ(At(station, "centre").y, 0.0);
+
+  // Limits: the node rectangle, widened by half the 4 x 2 button (min x narrowed).
+  double a = 0, b = 0, c = 0, d = 0;
+  Rep(station, "at-lefttop")->GetPositioningLimits(a, b, c, d);
+  EXPECT_EQ(a, -52.0);
+  EXPECT_EQ(b, -19.0);
+  EXPECT_EQ(c, 52.0);
+  EXPECT_EQ(d, 21.0);
+}
+
+TEST_F(ZitBltManagerTest, OffsetsAreHalfSizesInSinglePrecision) {
+  Move(station, 0.1, 0.2);
+  QELIPertNode_var(station)->SetSize(0.3, 0.7);
+  Manager(station)->BuildZitBltReps(viewer);
+  const VORMathPoint2D p = At(station, "at-righttop");
+  EXPECT_EQ(p.x, 0.1 + static_cast<double>(static_cast<float>(0.15)));
+  EXPECT_EQ(p.y, 0.2 + static_cast<double>(static_cast<float>(0.35)));
+  EXPECT_NE(p.x, 0.1 + 0.15);
+}
+
+TEST_F(ZitBltManagerTest, StatusesAndAllOneWhenFreshZeroAfterRemoval) {
+  QELIZitBltMgr_var manager = Manager(station);
+  unsigned char status = 7;
+  ASSERT_EQ(manager->GetZitBltStatus("All", status), S_OK);
+  EXPECT_EQ(status, 1);
+  manager->BuildZitBltReps(viewer);
+
+  int announcements = 0;
+  VOREventPublisher* publisher = VORIModelEvents_var(station)->GetEventPublisher();
+  std::vector<VORCallbackId> ids;
+  for (const char* kind : {"VORModify", "QELPertAppInfoNotify"})
+    ids.push_back(
+        publisher->AddCallback(kind, [&](VORBaseUnknown*, const std::string&, VORNotification*,
+                                         void*, VORCallbackId) { ++announcements; }));
+  EXPECT_EQ(manager->SetZitBltStatus("at-lefttop", 0), S_OK);
+  EXPECT_FALSE(Rep(station, "at-lefttop")->GetZitBltBtn()->IsShown());
+  EXPECT_EQ(manager->GetZitBltStatus("at-lefttop", status), S_OK);
+  EXPECT_EQ(status, 0);
+  // An unknown name fails but is still announced, and leaves the output alone.
+  EXPECT_EQ(manager->SetZitBltStatus("nothing", 0), E_FAIL);
+  EXPECT_EQ(announcements, 4);
+  status = 7;
+  EXPECT_EQ(manager->GetZitBltStatus("nothing", status), E_FAIL);
+  EXPECT_EQ(status, 7);
+  EXPECT_EQ(manager->SetZitBltStatus("All", 0), S_OK);
+  manager->GetZitBltStatus("All", status);
+  EXPECT_EQ(status, 0);
+  manager->SetZitBltStatus("All", 1);
+  for (VORCallbackId id : ids)
+    publisher->RemoveCallback(id);
+
+  // A hidden ZitBlt stays hidden when its reps are rebuilt.
+  manager->BuildZitBltReps(viewer);
+  EXPECT_FALSE(Rep(station, "at-lefttop")->GetZitBltBtn()->IsShown());
+
+  EXPECT_EQ(manager->RemoveZitBlts(), S_OK);
+  manager->GetZitBltStatus("All", status);
+  EXPECT_EQ(status, 0);
+  QELZitBltRep* rep = Rep(station, "at-lefttop");
+  EXPECT_EQ(rep, nullptr);
+  EXPECT_EQ(manager->GetZitBlt("at-lefttop", nullptr), E_FAIL);
+  EXPECT_FALSE(QELIZitBltCBSubscriber_var(station)->IsSubscribed());
+  // A later build comes back from the cached configuration.
+  manager->BuildZitBltReps(viewer);
+  EXPECT_EQ(Names(station).size(), 15u);
+  EXPECT_TRUE(Rep(station, "at-lefttop")->GetZitBltBtn()->IsShown());
+}
+
+TEST_F(ZitBltManagerTest, ZitBltsFollowNodeMovesAndKeepTheirRelativePlaceOnResize) {
+  QELIZitBltMgr_var manager = Manager(station);
+  manager->BuildZitBltReps(viewer);  // at (0, 0): counts as never placed
+  Move(station, 30, 5);
+  manager->UpdateZitBltPositions();  // only records the geometry
+  EXPECT_EQ(At(station, "at-bottommiddle").x, 0.0);
+  EXPECT_EQ(At(station, "at-bottommiddle").y, -20.0);
+  manager->RemoveZitBlts();
+  Move(station, 10, 0);
+  manager->BuildZitBltReps(viewer);
+  Move(station, 40, 8);
+  manager->UpdateZitBltPositions();
+  EXPECT_EQ(At(station, "at-bottommiddle").x, 40.0);
+  EXPECT_EQ(At(station, "at-bottommiddle").y, -12.0);
+  // On the left edge (-10 = 40 - 50) before the resize, on the new left edge after it.
+  EXPECT_EQ(At(station, "at-lefttop").x, -10.0);
+  QELIPertNode_var(station)->SetSize(200, 40);
+  manager->UpdateZitBltPositions();
+  EXPECT_DOUBLE_EQ(At(station, "at-lefttop").x, -60.0);
+  EXPECT_DOUBLE_EQ(At(station, "at-lefttop").y, 28.0);
+  EXPECT_DOUBLE_EQ(At(station, "at-rightmiddle").x, 140.0);
+  double a = 0, b = 0, c = 0, d = 0;
+  Rep(station, "at-lefttop")->GetPositioningLimits(a, b, c, d);
+  EXPECT_EQ(a, -62.0);
+  EXPECT_EQ(c, 142.0);
+}
+
+TEST_F(ZitBltManagerTest, StatusBarRefreshClimbsToTheParentOnlyWithAnUpdateCommand) {
+  Manager(grouping)->BuildZitBltReps(viewer);
+  Manager(station)->BuildZitBltReps(viewer);
+  Manager(loading)->BuildZitBltReps(viewer);
+  // Each command was handed its rep once, at the build (the reps here show no list).
+  EXPECT_EQ(*log,
+            (std::vector<std::string>{"G/BIWStationStatusBars/none", "G/BIWGroupingStatusBars/none",
+                                      "G/ProductInput/none", "S/BIWStationStatusBars/none"}));
+  log->clear();
+  Manager(station)->UpdateZitBlt("BIWStationStatusBars");
+  EXPECT_EQ(*log,
+            (std::vector<std::string>{"S/BIWStationStatusBars/none", "G/BIWStationStatusBars/none",
+                                      "G/BIWGroupingStatusBars/none"}));
+  log->clear();
+  Manager(station)->UpdateZitBlt("ProductOutput");         // no update command
+  Manager(loading)->UpdateZitBlt("BIWStationStatusBars");  // a status bar without command
+  EXPECT_TRUE(log->empty());
+  Manager(grouping)->UpdateZitBlt("ProductInput");  // not a status bar: stays here
+  EXPECT_EQ(*log, std::vector<std::string>{"G/ProductInput/none"});
+  log->clear();
+  Manager(grouping)->UpdateAllZitBlts();
+  EXPECT_EQ(*log,
+            (std::vector<std::string>{"G/BIWStationStatusBars/none", "G/BIWGroupingStatusBars/none",
+                                      "G/ProductInput/none"}));
+}
+
+TEST_F(ZitBltManagerTest, SubscriberPassesOnlyItsOwnActivitysChangesUnlessMuted) {
+  Manager(grouping)->BuildZitBltReps(viewer);
+  Manager(station)->BuildZitBltReps(viewer);
+  log->clear();
+  VOREventPublisher* publisher = VORISPPActivityModificationEvents_var(root)->GetEventPublisher();
+  auto dispatch = [&](VORBaseUnknown* father, SPPModifyKind kind) {
+    auto n = VORHandle<VORSPPActivityNotification>::Adopt(
+        new VORSPPActivityNotification(father, loading, kind));
+    publisher->Dispatch(VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(), n);
+  };
+  dispatch(station, SPPResourceAssigned);  // a kind the base command does not handle
+  EXPECT_TRUE(log->empty());
+  dispatch(station, SPPItemAssigned);  // the station's one command refreshes it and its parents
+  EXPECT_EQ(*log, (std::vector<std::string>{
+                      "S/BIWStationStatusBars/none", "G/BIWStationStatusBars/none",
+                      "G/BIWGroupingStatusBars/none", "G/BIWStationStatusBars/none"}));
+  log->clear();
+  QELIZitBltCBSubscriber_var subscriber(station);
+  subscriber->SetCallbacksSuspended(true);
+  dispatch(station, SPPItemAssigned);
+  EXPECT_TRUE(log->empty());
+  subscriber->SetCallbacksSuspended(false);
+  QELBaseListZitBltCmd* command = nullptr;
+  EXPECT_EQ(subscriber->GetUpdateCommand("ProductOutput", &command), E_FAIL);
+  EXPECT_EQ(subscriber->GetUpdateCommand("BIWStationStatusBars", nullptr), E_FAIL);
+}
+
+TEST_F(ZitBltManagerTest, MissingConfigurationGivesNoZitBltsUntilTheFileAppears) {
+  std::filesystem::remove(startup.Path() / "zitbltcfg.xml");
+  QELZitBltConfiguration::ForgetForTests();
+  // The bundled resources are on the path too: hide them for this test.
+  setenv("VORStartupPath", startup.Path().c_str(), 1);
+  EXPECT_TRUE(Names(station).empty());
+  Manager(station)->RemoveZitBlts();
+  startup.WriteConfig(Config());
+  Manager(station)->BuildZitBltReps(viewer);
+  EXPECT_EQ(Names(station).size(), 15u);
+}
+
+}  // namespace
