@@ -260,3 +260,47 @@ TEST_F(StateCommandTest, RepeatModeStartsOverAfterTheFinalState) {
   EXPECT_TRUE(ends.empty());
   EXPECT_EQ(command->GetCurrentState()->GetName().str(), "Default");
 }
+
+namespace {
+// Like a command whose dialog has nothing to show: the action accepts the close agent of the
+// next state itself, so the command ends as soon as it gets there.
+class AcceptAhead : public VORStateCommand {
+ public:
+  explicit AcceptAhead(bool acceptAhead) : VORStateCommand("AcceptAhead"), _ahead(acceptAhead) {}
+  void BuildGraph() override {
+    _pick = VORPathElementAgent_var::Adopt(new VORPathElementAgent("Pick"));
+    _close = VORDialogAgent_var::Adopt(new VORDialogAgent("Close"));
+    VORDialogState* first = GetInitialState("initialState");
+    first->AddDialogAgent(_pick);
+    VORDialogState* close = AddDialogState("Close");
+    close->AddDialogAgent(_close);
+    AddTransition(first, close, IsOutputSetCondition(_pick), Action(this, &AcceptAhead::Show));
+    AddTransition(close, nullptr, IsOutputSetCondition(_close));
+  }
+  bool Show(void*) {
+    if (_ahead)
+      _close->Accept();
+    return true;
+  }
+
+ private:
+  bool _ahead;
+  VORPathElementAgent_var _pick;
+  VORDialogAgent_var _close;
+};
+}  // namespace
+
+TEST_F(StateCommandTest, AnAgentAcceptedBeforeItsStateIsCurrentFiresWhenTheStateIsEntered) {
+  auto* command = new AcceptAhead(true);
+  VORCommandEngine::Start(command);
+  command->Release();
+  Pick(thing);
+  EXPECT_EQ(ends, (std::vector<std::string>{"AcceptAhead done"}));
+
+  auto* waiting = new AcceptAhead(false);
+  VORCommandEngine::Start(waiting);
+  waiting->Release();
+  Pick(thing);
+  EXPECT_TRUE(waiting->IsRunning());
+  EXPECT_EQ(waiting->GetCurrentState()->GetName().str(), "Close");
+}

@@ -47,6 +47,14 @@ class VORDialogAgent : public VORCommand {
   // The notification that set the output last (null when none).
   VORNotification* GetLastNotification() const { return _lastNotification.get(); }
 
+  // Sets the output at once, as if the user had acted (for example to end a command whose
+  // dialog could not be shown). It fires when the agent's state is or becomes current.
+  void Accept() { SetOutput(nullptr, nullptr); }
+  // A state command makes the agents of its current state active; notifications reaching an
+  // inactive agent are ignored. Agents outside any state command are always active.
+  bool IsActive() const { return _active; }
+  void SetActive(bool active) { _active = active; }
+
   // Forgets the output and the value; notifications stay subscribed.
   virtual void Reset();
   // The engine clears the output flag once a transition consumed it; the value stays readable.
@@ -68,6 +76,7 @@ class VORDialogAgent : public VORCommand {
 
  private:
   bool _outputSet = false;
+  bool _active = true;
   VORBaseUnknown_var _value;
   VORHandle<VORNotification> _lastNotification;
   VORDialogState* _state = nullptr;

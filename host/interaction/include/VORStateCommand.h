@@ -108,6 +108,7 @@ class VORStateCommand : public VORDialogAgent {
   void Enter(VORDialogState* state, bool atStart);
   void Evaluate();
   void End(bool cancelled);
+  void SetAgentsActive();
 
   int _engineMode;
   int _commandMode;

@@ -14,7 +14,8 @@ void VORDialogAgent::AcceptOnNotify(VOREventPublisher* publisher, const char* no
     return;
   AddCallback(publisher, notificationName,
               [this](VORBaseUnknown*, VORNotification* notification, void*) {
-                SetOutput(nullptr, notification);
+                if (_active)
+                  SetOutput(nullptr, notification);
               });
 }
 

@@ -89,6 +89,7 @@ VORStatusChangeRC VORStateCommand::Cancel(VORCommand*, VORNotification*) {
 
 void VORStateCommand::Enter(VORDialogState* state, bool atStart) {
   _current = state;
+  SetAgentsActive();
   if (!atStart)
     return;
   for (const VORDialogAgent_var& agent : state->GetAgents()) {
@@ -118,18 +119,9 @@ VORNotifPropagation VORStateCommand::AnalyseNotification(VORCommand* from,
   auto* output = dynamic_cast<VORAgentOutputNotification*>(notification);
   if (output == nullptr)
     return VORDialogAgent::AnalyseNotification(from, notification);
-  VORDialogAgent* agent = output->GetAgent();
-  bool inCurrentState = false;
-  if (_running && _current != nullptr) {
-    for (const VORDialogAgent_var& a : _current->GetAgents())
-      inCurrentState = inCurrentState || a.get() == agent;
-  }
-  if (!inCurrentState) {
-    // An agent of another state (or of an ended command) speaks: nothing fires later from it.
-    agent->ClearOutput();
-    return VORNotifDontPropagate;
-  }
-  Evaluate();
+  // An agent of another state keeps its output: it fires when its state becomes current.
+  if (_running)
+    Evaluate();
   return VORNotifDontPropagate;
 }
 
@@ -177,6 +169,17 @@ void VORStateCommand::Evaluate() {
   _evaluating = false;
 }
 
+void VORStateCommand::SetAgentsActive() {
+  for (auto& state : _states) {
+    for (const VORDialogAgent_var& agent : state->GetAgents())
+      agent->SetActive(false);
+  }
+  if (_running && _current != nullptr) {
+    for (const VORDialogAgent_var& agent : _current->GetAgents())
+      agent->SetActive(true);
+  }
+}
+
 void VORStateCommand::End(bool cancelled) {
   VORStateCommand_var keep(this);
   // What the command's picks highlighted goes with it.
@@ -185,6 +188,7 @@ void VORStateCommand::End(bool cancelled) {
   _running = false;
   _ended = true;
   _current = nullptr;
+  SetAgentsActive();
   auto notification =
       VORHandle<VORCommandEndNotification>::Adopt(new VORCommandEndNotification(this, cancelled));
   DispatchNotification(notification);
