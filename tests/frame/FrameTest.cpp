@@ -63,6 +63,25 @@ TEST_F(FrameTest, TheCurrentWindowDecidesTheCurrentEditorAndDeletedWindowsAreRel
   EXPECT_EQ(watched->RefCount(), refs - 1);
 }
 
+TEST_F(FrameTest, TheLayoutAnnouncesWindowsJoiningLeavingAndBecomingCurrent) {
+  std::vector<std::string> log;
+  auto subscriber = VORCommand_var::Adopt(new VORCommand());
+  subscriber->AddCallback(
+      layout->GetEventPublisher(), "VORFrmLayoutNotification",
+      [&](VORBaseUnknown*, VORNotification* n, void*) {
+        auto* change = static_cast<VORFrmLayoutNotification*>(n);
+        static const char* names[] = {"added", "removed", "current"};
+        log.push_back(std::string(names[change->GetChange()]) + " " +
+                      (change->GetWindow() ? change->GetWindow()->GetName().str() : "none"));
+      });
+  auto* space = new VORNewInventorySpaceWnd("Space", editor);
+  layout->SetCurrentWindow(space);  // already current: no news
+  space->DeleteWindow();
+  EXPECT_EQ(log, (std::vector<std::string>{"added Space", "current Space", "removed Space",
+                                           "current Process"}));
+  VORDeferredDeletion::Drain();
+}
+
 TEST_F(FrameTest, TilingPlacesWindowsSideBySideAndSendsSizeNotifications) {
   int sizeNotifications = 0;
   VORFrmWindow* tree = layout->GetWindowList()[0];

@@ -4,8 +4,26 @@
 
 #include <vector>
 
+#include "VOREventPublisher.h"
 #include "VORFrmWindow.h"
 #include "VORLists.h"
+
+// Sent on the layout's publisher when a window joins or leaves it or becomes current, so that a
+// GUI can follow the windows without polling.
+class VORFrmLayoutNotification : public VORNotification {
+  VOR_DECLARE_CLASS(VORFrmLayoutNotification, VORNotification)
+ public:
+  enum Change { WindowAdded, WindowRemoved, CurrentWindowChanged };
+  VORFrmLayoutNotification(VORFrmWindow* window, Change change)
+      : _window(window), _change(change) {}
+  // The window concerned (null when no window is current any more).
+  VORFrmWindow* GetWindow() const { return _window.get(); }
+  Change GetChange() const { return _change; }
+
+ private:
+  VORFrmWindow_var _window;
+  Change _change;
+};
 
 class VORFrmLayout : public VORBaseUnknown {
   VOR_DECLARE_CLASS(VORFrmLayout, VORBaseUnknown)
@@ -32,6 +50,9 @@ class VORFrmLayout : public VORBaseUnknown {
   VORRectangle GetClientArea() const { return _clientArea; }
   void SetClientArea(const VORRectangle& area) { _clientArea = area; }
 
+  // Dispatches VORFrmLayoutNotification.
+  VOREventPublisher* GetEventPublisher() const { return _publisher.get(); }
+
   // Used by VORFrmWindow.
   void AddWindow(VORFrmWindow* window);
   void RemoveWindow(VORFrmWindow* window);
@@ -40,6 +61,10 @@ class VORFrmLayout : public VORBaseUnknown {
   ~VORFrmLayout() override;
 
  private:
+  void Announce(VORFrmWindow* window, VORFrmLayoutNotification::Change change);
+
+  VORHandle<VOREventPublisher> _publisher =
+      VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher(this));
   std::vector<VORFrmWindow_var> _windows;
   VORFrmWindow* _current = nullptr;
   int _mdiState = MDIMaximized;

@@ -95,9 +95,17 @@ void VORFrmLayout::SetCurrentWindow(VORFrmWindow* window) {
   if (window != nullptr && std::none_of(_windows.begin(), _windows.end(),
                                         [window](const auto& w) { return w.get() == window; }))
     return;
+  const bool changed = _current != window;
   _current = window;
   if (window != nullptr && window->GetEditor() != nullptr)
     VORFrmEditor::SetCurrentEditor(window->GetEditor());
+  if (changed)
+    Announce(window, VORFrmLayoutNotification::CurrentWindowChanged);
+}
+
+void VORFrmLayout::Announce(VORFrmWindow* window, VORFrmLayoutNotification::Change change) {
+  auto n = VORHandle<VORFrmLayoutNotification>::Adopt(new VORFrmLayoutNotification(window, change));
+  _publisher->Dispatch(n);
 }
 
 void VORFrmLayout::TileHorizontally() {
@@ -115,6 +123,7 @@ void VORFrmLayout::AddWindow(VORFrmWindow* window) {
   _windows.push_back(VORFrmWindow_var::Adopt(window));
   if (_mdiState == MDIMaximized)
     window->SetRectangle(_clientArea);
+  Announce(window, VORFrmLayoutNotification::WindowAdded);
   SetCurrentWindow(window);
 }
 
@@ -123,8 +132,10 @@ void VORFrmLayout::RemoveWindow(VORFrmWindow* window) {
                          [window](const auto& w) { return w.get() == window; });
   if (it == _windows.end())
     return;
+  VORFrmWindow_var keep(window);
   VORCommandDeletion(it->Detach());
   _windows.erase(it);
+  Announce(window, VORFrmLayoutNotification::WindowRemoved);
   if (_current == window)
     SetCurrentWindow(_windows.empty() ? nullptr : _windows.back().get());
 }
