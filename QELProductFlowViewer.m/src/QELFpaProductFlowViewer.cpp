@@ -125,7 +125,9 @@ QELFpaProductFlowViewer::QELFpaProductFlowViewer(const VORString& name, VORFrmEd
       VORIGENode_var node(child);
       bool created = false;
       QELFpaPertBaseServices::GetPertExtension(node, created);
-      QELFpaPertBaseServices::InitNodePosition(node);
+      // A node never placed in a chart is new: it waits for the organiser.
+      if (QELFpaPertBaseServices::InitNodePosition(node) == S_OK)
+        _nodesForReArrangement->Append(child);
     }
     delete nodes;
   }
@@ -170,11 +172,11 @@ QELFpaProductFlowViewer::~QELFpaProductFlowViewer() {
     delete _nodesForReArrangement;
     _nodesForReArrangement = nullptr;
   }
+  // The window's editor may be gone by now (closing a document deletes its windows first, but
+  // they are released after the editor); DeleteWindow left its ISO already.
   if (VORFrmEditor* editor = VORFrmEditor::GetCurrentEditor();
       editor != nullptr && editor->GetISO() != nullptr)
     editor->GetISO()->RemoveViewer(_viewer.get());
-  if (GetEditor() != nullptr && GetEditor()->GetISO() != nullptr)
-    GetEditor()->GetISO()->RemoveViewer(_viewer.get());
   SetViewer(nullptr);
   _viewer = nullptr;
   QELPertParameters::PERT_GRID_CELL_SIZE = 25.0;
@@ -405,6 +407,8 @@ void QELFpaProductFlowViewer::DeleteWindow() {
     _viewer->RemoveRep(_grid);
   ViewerName viewerName = PertViewerClassic;
   QELPertClientVisuServices::SetViewerName(viewerName);
+  if (GetEditor() != nullptr && GetEditor()->GetISO() != nullptr)
+    GetEditor()->GetISO()->RemoveViewer(_viewer.get());
   VORFrmWindow::DeleteWindow();
   ReleaseController();
   Trace().TraPrint("QELFpaProductFlowViewer::DeleteWindow <--");

@@ -427,3 +427,10 @@ void QELPFVNodeOrganiser::DisplayCyclicWarningDialog() {
     notify->RequestDelayedDestruction();
   }
 }
+
+extern "C" int QELPFVArrangeChart(VORBaseUnknown* root, QELPertController* controller) {
+  auto organiser = VORHandle<QELPFVNodeOrganiser>::Adopt(new QELPFVNodeOrganiser());
+  if (!organiser->ArrangeNodes(VORBaseUnknown_var(root), controller))
+    return -1;
+  return organiser->IsCyclic() ? 1 : 0;
+}

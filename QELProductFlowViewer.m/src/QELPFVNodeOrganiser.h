@@ -63,3 +63,8 @@ class QELPFVNodeOrganiser : public VORCommand {
   std::vector<std::vector<int>> _successors;
   std::vector<int> _order;
 };
+
+// For programs that load the module by name (VORModuleLoader::FindSymbol): lays out the
+// children of root in controller's chart with a fresh organiser. 0 when laid out, 1 when the
+// flows are cyclic (nothing moved), -1 for bad arguments.
+extern "C" int QELPFVArrangeChart(VORBaseUnknown* root, QELPertController* controller);

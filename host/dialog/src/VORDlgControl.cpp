@@ -85,9 +85,10 @@ void VORDlgControl::Changed() {
 namespace VORDlg {
 
 VOREventPublisher* GetGlobalPublisher() {
-  static VORHandle<VOREventPublisher> publisher =
-      VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
-  return publisher;
+  // Never destroyed: dialogs released at exit still announce it.
+  static auto* publisher = new VORHandle<VOREventPublisher>(
+      VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher()));
+  return *publisher;
 }
 
 namespace {

@@ -4,8 +4,8 @@
 
 namespace {
 std::vector<VORDlgDialog*>& Alive() {
-  static std::vector<VORDlgDialog*> alive;
-  return alive;
+  static auto* alive = new std::vector<VORDlgDialog*>();  // never destroyed
+  return *alive;
 }
 }  // namespace
 

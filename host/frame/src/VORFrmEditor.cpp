@@ -4,8 +4,8 @@
 
 namespace {
 VORFrmEditor_var& Current() {
-  static VORFrmEditor_var current;
-  return current;
+  static auto* current = new VORFrmEditor_var();  // never destroyed
+  return *current;
 }
 }  // namespace
 

@@ -10,8 +10,8 @@ struct Clipboard {
   bool open = true;
 };
 Clipboard& TheClipboard() {
-  static Clipboard clipboard;
-  return clipboard;
+  static auto* clipboard = new Clipboard();  // never destroyed: used until exit
+  return *clipboard;
 }
 
 VORBaseUnknown_var LeafOf(const VORBaseUnknown_var& pathOrObject) {

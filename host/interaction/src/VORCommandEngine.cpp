@@ -5,13 +5,14 @@
 
 namespace {
 VORCommand_var& Running() {
-  static VORCommand_var running;
-  return running;
+  // Never destroyed: a command still running at exit is not released after its dependencies.
+  static auto* running = new VORCommand_var();
+  return *running;
 }
 VORHandle<VOREventPublisher>& Publisher() {
-  static VORHandle<VOREventPublisher> publisher =
-      VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
-  return publisher;
+  static auto* publisher = new VORHandle<VOREventPublisher>(
+      VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher()));
+  return *publisher;
 }
 }  // namespace
 

@@ -7,12 +7,12 @@
 
 namespace {
 std::map<std::string, VORCommandHeader_var>& Declared() {
-  static std::map<std::string, VORCommandHeader_var> declared;
-  return declared;
+  static auto* declared = new std::map<std::string, VORCommandHeader_var>();  // never destroyed
+  return *declared;
 }
 std::map<std::string, VORCommandHeader::HostFactory>& HostClasses() {
-  static std::map<std::string, VORCommandHeader::HostFactory> classes;
-  return classes;
+  static auto* classes = new std::map<std::string, VORCommandHeader::HostFactory>();
+  return *classes;
 }
 }  // namespace
 

@@ -194,8 +194,8 @@ struct Sets {
   VORISO_var iso;
 };
 Sets& Current() {
-  static Sets sets;
-  return sets;
+  static auto* sets = new Sets();  // never destroyed: editors may go after it at exit
+  return *sets;
 }
 }  // namespace
 

@@ -1,0 +1,561 @@
+// The Product Flow Viewer as a planner uses it, through the headless driver: opening, re-use and
+// refusal, titles, the organiser's levels, order, positions and cycle reports, placing new
+// nodes, and the default-node-positions command around super nodes.
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <cstdlib>
+#include <string>
+#include <vector>
+
+#include <cstdio>
+
+#include "QELFpaProductFlowViewer.h"
+#include "QELIFPAAdapters.h"
+#include "QELIPertNode.h"
+#include "QELIPertNodeExt.h"
+#include "QELIPertWindow.h"
+#include "QELPFVNodeOrganiser.h"
+#include "QELPertNotifications.h"
+#include "QELPertParameters.h"
+#include "SampleLine.h"
+#include "TempDir.h"
+#include "VORDeferredDeletion.h"
+#include "VORDocument.h"
+#include "VORDriver.h"
+#include "VORFileIO.h"
+#include "VORFrmWindowKinds.h"
+#include "VORIGraphNodeLayout.h"
+#include "VORIModelEvents.h"
+#include "VORModelDoor.h"
+#include "VORTrace.h"
+
+namespace {
+
+// The graph editor's snapping: centres of 25-unit cells.
+double Snap(double v) {
+  const double c = QELPertParameters::PERT_GRID_CELL_SIZE;
+  return std::floor((v - c / 2) / c + 0.5) * c + c / 2;
+}
+
+struct Point {
+  double x;
+  double y;
+  bool operator==(const Point&) const = default;
+};
+
+// A document built through the model's door, saved, and opened through the driver.
+class ViewerTest : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    unsetenv("ADL_ODT_OUT");
+    doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
+    root = doc->GetRootProcess();
+  }
+  void TearDown() override { unsetenv("ADL_ODT_OUT"); }
+
+  VORBaseUnknown_var Node(VORBaseUnknown* father, const char* label,
+                          const char* type = "BIWActivityStation") {
+    VORBaseUnknown_var node;
+    EXPECT_EQ(doc->GetDoor().CreateNode(father, type, node), S_OK);
+    doc->GetDoor().SetLabel(node, VORUnicodeString(label));
+    return node;
+  }
+  void Flow(const VORBaseUnknown_var& from, const VORBaseUnknown_var& to) {
+    EXPECT_EQ(doc->GetDoor().AddFlow(from, to), S_OK);
+  }
+  // Saves the document built so far and opens it; the driver's document replaces doc.
+  void Open(const std::string& name = "line.pprx") {
+    std::string error;
+    const std::string file = dir.Path() + "/" + name;
+    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
+    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
+    doc = driver.GetDocument();
+    root = doc->GetRootProcess();
+  }
+  VORBaseUnknown* Find(const char* label) const { return driver.FindObject(label); }
+  // Selects the activity, then starts the command, which takes the selection.
+  bool OpenViewerOn(const char* label) {
+    return driver.PickObject(label) && driver.StartCommand("QELFpaProductFlowViewerCmd");
+  }
+  std::vector<QELFpaProductFlowViewer*> Viewers() const {
+    std::vector<QELFpaProductFlowViewer*> viewers;
+    for (VORFrmWindow* w : VORFrmLayout::GetCurrentLayout()->GetWindowList()) {
+      if (w->IsAKindOf(QELFpaProductFlowViewer::ClassName()))
+        viewers.push_back(static_cast<QELFpaProductFlowViewer*>(w));
+    }
+    return viewers;
+  }
+  QELFpaProductFlowViewer* Viewer() const {
+    auto v = Viewers();
+    return v.empty() ? nullptr : v.front();
+  }
+  Point Position(const char* label) const {
+    Point p{0, 0};
+    VORIGraphNodeLayout_var(Find(label))->GetPertPosition(p.x, p.y);
+    return p;
+  }
+  // Runs an organiser on the viewer's level.
+  bool Arrange(QELPFVNodeOrganiser*& organiser) {
+    organiser = new QELPFVNodeOrganiser();
+    return organiser->ArrangeNodes(Viewer()->GetRootNode(), Viewer()->GetPertController());
+  }
+
+  TempDir dir;
+  VORDriver driver;
+  VORProcess_var doc;
+  VORBaseUnknown_var root;
+};
+
+}  // namespace
+
+// --- Opening, re-use and refusal -----------------------------------------------------------
+
+TEST_F(ViewerTest, OpensOnAPickedActivityShowsItsChildrenAndRegistersTheChart) {
+  auto a = Node(root, "A");
+  auto b = Node(root, "B");
+  Node(root, "Start", "Start");
+  Flow(a, b);
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line")) << driver.LastError();
+  const std::vector<std::string> events = driver.TakeEvents();
+  ASSERT_FALSE(events.empty());
+  EXPECT_EQ(events.back(), "command QELFpaProductFlowViewerCmd ended");
+  ASSERT_EQ(Viewers().size(), 1u);
+  QELFpaProductFlowViewer* viewer = Viewer();
+  EXPECT_EQ(viewer->GetName().str(), "LineProduct Flow Viewer");
+  EXPECT_EQ(viewer->GetRootNode(), root);
+  EXPECT_EQ(VORFrmLayout::GetCurrentLayout()->GetCurrentWindow(), viewer);
+  // Every child graph node is drawn, control nodes included.
+  ASSERT_NE(viewer->GetPertController(), nullptr);
+  EXPECT_EQ(viewer->GetPertController()->GetNodeCount(), 3);
+  EXPECT_EQ(QELIPertWindow_var(static_cast<VORFrmWindow*>(viewer))->GetPertController(),
+            viewer->GetPertController());
+  // All nodes were new: the whole level was laid out (A before B, one column each).
+  EXPECT_LT(Position("A").x, Position("B").x);
+  // The root process knows the chart.
+  QELIFPAAdapters_var adapters(root);
+  ASSERT_TRUE(adapters);
+  EXPECT_NE(adapters->GetPertAdapter(), nullptr);
+  EXPECT_EQ(adapters->GetPertController(), viewer->GetPertController());
+  double x = 0, y = 0;
+  EXPECT_EQ(adapters->GetPertAdapter()->GetStoredNodePosition(Find("B"), x, y), S_OK);
+  EXPECT_EQ((Point{x, y}), Position("B"));
+  // Closing the window lets the root process forget the controller.
+  ASSERT_TRUE(driver.CloseWindow(viewer->GetTitle().ConvertToUTF8()));
+  EXPECT_EQ(adapters->GetPertController(), nullptr);
+  EXPECT_TRUE(Viewers().empty());
+}
+
+TEST_F(ViewerTest, OneViewerPerDocumentIsReusedAndSwitchesLevels) {
+  auto a = Node(root, "A");
+  auto g = Node(root, "G", "BIWActivityGrouping");
+  Node(g, "G1");
+  Node(g, "G2");
+  Node(g, "G3");
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  QELFpaProductFlowViewer* viewer = Viewer();
+  // The same level again: the window is only made current.
+  ASSERT_TRUE(driver.ActivateWindow("line.pprx"));
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  EXPECT_EQ(Viewers().size(), 1u);
+  EXPECT_EQ(VORFrmLayout::GetCurrentLayout()->GetCurrentWindow(), viewer);
+  // Another level: the same window shows the group's children.
+  ASSERT_TRUE(OpenViewerOn("G"));
+  ASSERT_EQ(Viewers().size(), 1u);
+  EXPECT_EQ(Viewer(), viewer);
+  EXPECT_EQ(viewer->GetRootNode().Identity(), Find("G"));
+  EXPECT_EQ(viewer->GetPertController()->GetNodeCount(), 3);
+  EXPECT_TRUE(viewer->GetPertController()->IsInChart(Find("G2")));
+  EXPECT_FALSE(viewer->GetPertController()->IsInChart(Find("A")));
+  EXPECT_NE(viewer->GetWindowTitle().ConvertToUTF8().find("Line\\G"), std::string::npos);
+}
+
+TEST_F(ViewerTest, IsRefusedWhileTheDocumentsPertChartIsOpenButNotForAnotherDocument) {
+  Node(root, "A");
+  Open("first.pprx");
+  ASSERT_TRUE(driver.PickObject("Line"));
+  ASSERT_TRUE(driver.StartCommand("PertChart"));
+  driver.TakeEvents();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  EXPECT_TRUE(Viewers().empty());
+  ASSERT_FALSE(driver.Notifications().empty());
+  EXPECT_EQ(driver.Notifications().back().title, "Error");
+  EXPECT_EQ(driver.Notifications().back().text, "Please Close the PERT Chart and Try.");
+
+  // A second document without a PERT chart opens its viewer all the same.
+  doc = VORProcess_var::Adopt(VORProcess::CreateNew("Other"));
+  root = doc->GetRootProcess();
+  Node(root, "B");
+  Open("second.pprx");
+  const size_t shown = driver.Notifications().size();
+  ASSERT_TRUE(OpenViewerOn("Other"));
+  EXPECT_EQ(Viewers().size(), 1u);
+  EXPECT_EQ(driver.Notifications().size(), shown);
+}
+
+TEST_F(ViewerTest, OnlyActivitiesCanBePicked) {
+  Node(root, "A");
+  VORBaseUnknown_var panel;
+  ASSERT_EQ(doc->GetDoor().CreateProduct(doc->GetRootProduct(), "Side panel", panel), S_OK);
+  Open();
+  ASSERT_TRUE(driver.StartCommand("QELFpaProductFlowViewerCmd"));
+  driver.PickObject("Side panel");  // a product: refused, the command waits
+  EXPECT_NE(driver.GetRunningCommand(), nullptr);
+  EXPECT_TRUE(Viewers().empty());
+  ASSERT_TRUE(driver.PickObject("A"));
+  EXPECT_EQ(driver.GetRunningCommand(), nullptr);
+  ASSERT_EQ(Viewers().size(), 1u);
+  EXPECT_EQ(Viewer()->GetRootNode().Identity(), Find("A"));
+}
+
+TEST_F(ViewerTest, ClosingRestoresTheGraphEditorParametersAndTracesTheWindowsSteps) {
+  Node(root, "A");
+  Open();
+  std::vector<std::string> lines;
+  VORTrace::SetEnabledChannels("QELProductFlowViewerTrace,QELFpaViewerCmdsTrace");
+  VORTrace::SetSink([&](const std::string& channel, const std::string& line) {
+    lines.push_back(channel + ": " + line);
+  });
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  QELPertParameters::PERT_GRID_CELL_SIZE = 40.0;
+  QELPertParameters::PERT_LABEL_HEIGHT = 3.5;
+  ASSERT_TRUE(driver.CloseWindow(Viewer()->GetTitle().ConvertToUTF8()));
+  driver.DrainDeferred();
+  VORTrace::SetSink({});
+  VORTrace::SetEnabledChannels("");
+  EXPECT_EQ(QELPertParameters::PERT_GRID_CELL_SIZE, 25.0);
+  EXPECT_EQ(QELPertParameters::PERT_LABEL_HEIGHT, 2.0);
+  auto has = [&](const std::string& line) {
+    return std::find(lines.begin(), lines.end(), line) != lines.end();
+  };
+  EXPECT_TRUE(has("QELFpaViewerCmdsTrace:  \n  QELFpaProductFlowViewerCmd::BuildGraph -->"));
+  EXPECT_TRUE(has("QELFpaViewerCmdsTrace: Created the PERT Adapter"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELFpaProductFlowViewer::Constructor <--"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELFpaProductFlowViewer::DeleteWindow <--"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELPFVNodeOrganiser::ArrangeNodes -->"));
+  EXPECT_EQ(std::count(lines.begin(), lines.end(),
+                       "QELProductFlowViewerTrace: QELFpaProductFlowViewer::Destructor -->"),
+            2);
+}
+
+// --- Titles --------------------------------------------------------------------------------
+
+TEST_F(ViewerTest, TheTitleNamesFileAndLevelPathAndShortensToTheWindowWidth) {
+  auto g = Node(root, "Framing group", "BIWActivityGrouping");
+  Node(g, "S1");
+  Open("underbody.pprx");
+  ASSERT_TRUE(OpenViewerOn("Framing group"));
+  QELFpaProductFlowViewer* viewer = Viewer();
+  const std::string full = "underbody.pprx\\Line\\Framing group - Product Flow Viewer";
+  EXPECT_EQ(viewer->GetWindowTitle().ConvertToUTF8(), full);
+  EXPECT_EQ(viewer->GetTitle().ConvertToUTF8(), full) << "wide enough: shown whole";
+  // 200 pixels for 55 characters: the first and last 10 around "...".
+  viewer->SetRectangle(VORRectangle{0, 0, 200, 300});
+  EXPECT_EQ(viewer->GetTitle().ConvertToUTF8(),
+            full.substr(0, 10) + "..." + full.substr(full.size() - 10));
+  // Growing the window shows it whole again.
+  viewer->SetRectangle(VORRectangle{0, 0, 1000, 300});
+  EXPECT_EQ(viewer->GetTitle().ConvertToUTF8(), full);
+  // Before the window is placed, the viewer's width (800) decides.
+  viewer->SetRectangle(VORRectangle{0, 0, 0, 0});
+  viewer->SetPFWindowName(VORIGENode_var(root));
+  EXPECT_EQ(viewer->GetWindowTitle().ConvertToUTF8(), "underbody.pprx\\Line - Product Flow Viewer");
+  EXPECT_EQ(viewer->GetTitle(), viewer->GetWindowTitle());
+}
+
+// --- The organiser: levels, order, positions and cycles --------------------------------------
+
+TEST_F(ViewerTest, AChainTakesOneColumnPerLevelAndIndependentNodesShareOne) {
+  auto a = Node(root, "A");
+  auto b = Node(root, "B");
+  auto c = Node(root, "C");
+  Flow(a, b);
+  Flow(b, c);
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  // Levels 0, 1, 2: square side 100, 50 between columns, y = 50; snapped as it goes.
+  const double x0 = Snap(0.0);
+  const double x1 = Snap(x0 + 50.0);
+  const double x2 = Snap(x1 + 50.0);
+  EXPECT_EQ(Position("A"), (Point{x0, Snap(50.0)}));
+  EXPECT_EQ(Position("B"), (Point{x1, Snap(50.0)}));
+  EXPECT_EQ(Position("C"), (Point{x2, Snap(50.0)}));
+  // The chart's boxes follow the document.
+  double bx = 0, by = 0;
+  QELIPertNodeExt_var(Find("B"))->GetPosition(bx, by, 1);
+  EXPECT_EQ((Point{bx, by}), Position("B"));
+}
+
+TEST_F(ViewerTest, ThreeIndependentNodesSpreadOverTheSquareInOneColumn) {
+  Node(root, "P");
+  Node(root, "Q");
+  Node(root, "R");
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  // Side 150, rows at 25, 75, 125, each snapped and the next row added to the snapped value.
+  const double y0 = Snap(25.0);
+  const double y1 = Snap(y0 + 50.0);
+  const double y2 = Snap(y1 + 50.0);
+  EXPECT_EQ(Position("P"), (Point{Snap(0.0), y0}));
+  EXPECT_EQ(Position("Q"), (Point{Snap(0.0), y1}));
+  EXPECT_EQ(Position("R"), (Point{Snap(0.0), y2}));
+}
+
+TEST_F(ViewerTest, WithinALevelTheOrderFollowsThePreviousLevelNotTheChildList) {
+  // Children in the order X, A, Y, B with A -> Y and B -> X.
+  auto x = Node(root, "X");
+  auto a = Node(root, "A");
+  auto y = Node(root, "Y");
+  auto b = Node(root, "B");
+  Flow(a, y);
+  Flow(b, x);
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  QELPFVNodeOrganiser* organiser = nullptr;
+  EXPECT_TRUE(Arrange(organiser));
+  const VORListPtrVORListValVORBaseUnknown_var& lists = *organiser->GetLevelLists();
+  ASSERT_EQ(lists.Size(), 2);
+  ASSERT_EQ(lists[1]->Size(), 2);
+  ASSERT_EQ(lists[2]->Size(), 2);
+  EXPECT_EQ((*lists[1])[1].Identity(), Find("A"));
+  EXPECT_EQ((*lists[1])[2].Identity(), Find("B"));
+  EXPECT_EQ((*lists[2])[1].Identity(), Find("Y"));
+  EXPECT_EQ((*lists[2])[2].Identity(), Find("X"));
+  organiser->RequestDelayedDestruction();
+  EXPECT_LT(Position("A").y, Position("B").y);
+  EXPECT_LT(Position("Y").y, Position("X").y);
+}
+
+TEST_F(ViewerTest, UnequalBranchesThatMeetAgainAreReportedAtTheMeetingNodeAndNothingMoves) {
+  auto a = Node(root, "A");
+  auto b = Node(root, "B");
+  auto c = Node(root, "C");
+  auto d = Node(root, "D");
+  auto e = Node(root, "E");
+  Flow(a, b);
+  Flow(b, d);
+  Flow(a, c);
+  Flow(c, e);
+  Flow(e, d);
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  ASSERT_FALSE(driver.Notifications().empty());
+  const VORDlgNotifyRecord& warning = driver.Notifications().back();
+  EXPECT_EQ(warning.title, "Cyclic Precedence");
+  ASSERT_GE(warning.text.size(), 2u);
+  EXPECT_EQ(warning.text.substr(warning.text.size() - 2), " D");
+  for (const char* label : {"A", "B", "C", "D", "E"})
+    EXPECT_FALSE(VORIGraphNodeLayout_var(Find(label))->HasPertPosition()) << label;
+}
+
+TEST_F(ViewerTest, ATrueCycleNamesTheFirstNodeMetAgainAndTheWarningCanBeSilenced) {
+  auto a = Node(root, "A");
+  auto b = Node(root, "B");
+  Flow(a, b);
+  Flow(b, a);
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  ASSERT_FALSE(driver.Notifications().empty());
+  const std::string text = driver.Notifications().back().text;
+  EXPECT_EQ(text.substr(text.size() - 2), " A");
+
+  setenv("ADL_ODT_OUT", "1", 1);
+  const size_t shown = driver.Notifications().size();
+  QELPFVNodeOrganiser* organiser = nullptr;
+  EXPECT_TRUE(Arrange(organiser));
+  EXPECT_TRUE(organiser->IsCyclic());
+  EXPECT_EQ(organiser->GetCyclicActivityName().ConvertToUTF8(), "A");
+  organiser->RequestDelayedDestruction();
+  EXPECT_EQ(driver.Notifications().size(), shown) << "no dialog under ADL_ODT_OUT";
+}
+
+TEST_F(ViewerTest, EveryMoveIsAnnouncedOnTheChartRoot) {
+  auto a = Node(root, "A");
+  auto b = Node(root, "B");
+  Flow(a, b);
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  std::vector<std::string> moved;
+  VORIModelEvents_var events(root);
+  const VORCallbackId id = events->GetEventPublisher()->AddCallback(
+      "QELPertPositionNotify",
+      [&](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
+        auto* p = static_cast<QELPertPositionNotify*>(n);
+        VORUnicodeString label;
+        VORIGENode_var(p->GetNode())->GetLabel(label);
+        moved.push_back(label.ConvertToUTF8());
+      });
+  QELPFVNodeOrganiser* organiser = nullptr;
+  EXPECT_TRUE(Arrange(organiser));
+  organiser->RequestDelayedDestruction();
+  events->GetEventPublisher()->RemoveCallback(id);
+  EXPECT_EQ(moved, (std::vector<std::string>{"A", "B"}));
+}
+
+TEST_F(ViewerTest, BadArgumentsAreRefusedAndEmptyLevelsAreNoError) {
+  Node(root, "A");
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  auto* organiser = new QELPFVNodeOrganiser();
+  EXPECT_FALSE(organiser->ArrangeNodes(NULL_var, Viewer()->GetPertController()));
+  EXPECT_FALSE(organiser->ArrangeNodes(root, nullptr));
+  EXPECT_TRUE(organiser->ArrangeNodes(Find("A"), Viewer()->GetPertController())) << "no children";
+  VORListValVORBaseUnknown_var* none = nullptr;
+  EXPECT_FALSE(organiser->PositionNewNode(root, none, Viewer()->GetPertController()));
+  organiser->RequestDelayedDestruction();
+}
+
+// --- PositionNewNode ------------------------------------------------------------------------
+
+TEST_F(ViewerTest, ANewNodeLandsWhereAFullLayoutPutsItWithEverythingDownstream) {
+  auto a = Node(root, "A");
+  auto b = Node(root, "B");
+  auto c = Node(root, "C");
+  Flow(a, b);
+  Flow(b, c);
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  const Point before[] = {Position("A"), Position("B"), Position("C")};
+  // A new node N after A, leading to C.
+  VORBaseUnknown_var n;
+  ASSERT_EQ(doc->GetDoor().CreateNode(root, "BIWActivityStation", n), S_OK);
+  doc->GetDoor().SetLabel(n, VORUnicodeString("N"));
+  doc->GetDoor().AddFlow(Find("A"), n);
+  doc->GetDoor().AddFlow(n, Find("C"));
+  VORBaseUnknown_var added(n);
+  Viewer()->GetPertController()->AddChildNode(added);
+
+  auto* newNodes = new VORListValVORBaseUnknown_var;
+  newNodes->Append(n);
+  auto* organiser = new QELPFVNodeOrganiser();
+  EXPECT_TRUE(organiser->PositionNewNode(root, newNodes, Viewer()->GetPertController()));
+  organiser->RequestDelayedDestruction();
+  delete newNodes;
+  // Levels: A 0, B and N 1, C 2; side 100, two rows on level 1 (25, 75), one on level 2.
+  // N's columns start one step right of A's position; B keeps its place, C moves with N.
+  const double x1 = before[0].x + 50.0;
+  const double yB = Snap(25.0);
+  const double yN = Snap(yB + 50.0);
+  EXPECT_EQ(Position("A"), before[0]);
+  EXPECT_EQ(Position("B"), before[1]);
+  EXPECT_EQ(Position("N"), (Point{Snap(x1), yN}));
+  EXPECT_EQ(Position("C"), (Point{Snap(Snap(x1) + 50.0), Snap(50.0)}));
+}
+
+TEST_F(ViewerTest, PositionNewNodeWithNothingNewOrAStrangerMovesNothing) {
+  auto a = Node(root, "A");
+  auto b = Node(root, "B");
+  Flow(a, b);
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  const Point pa = Position("A");
+  const Point pb = Position("B");
+  auto* list = new VORListValVORBaseUnknown_var;
+  auto* organiser = new QELPFVNodeOrganiser();
+  EXPECT_TRUE(organiser->PositionNewNode(root, list, Viewer()->GetPertController()));
+  organiser->RequestDelayedDestruction();
+  VORBaseUnknown_var stranger;
+  ASSERT_EQ(doc->GetDoor().CreateNode(Find("A"), "BIWActivityStation", stranger), S_OK);
+  list->Append(stranger);
+  organiser = new QELPFVNodeOrganiser();
+  EXPECT_TRUE(organiser->PositionNewNode(root, list, Viewer()->GetPertController()));
+  organiser->RequestDelayedDestruction();
+  delete list;
+  EXPECT_EQ(Position("A"), pa);
+  EXPECT_EQ(Position("B"), pb);
+}
+
+TEST_F(ViewerTest, TheChangeListKeepsDuplicatesOfNodesReachedTwice) {
+  auto a = Node(root, "A");
+  auto b = Node(root, "B");
+  auto c = Node(root, "C");
+  auto d = Node(root, "D");
+  Flow(a, b);
+  Flow(a, c);
+  Flow(b, d);
+  Flow(c, d);
+  auto* organiser = new QELPFVNodeOrganiser();
+  auto* list = new VORListValVORBaseUnknown_var;
+  organiser->GetActListForPosChange(a, list);
+  // A, its successors B C, then B's walk (B, D, D's walk: D), then C's (C, D, D).
+  std::vector<std::string> labels;
+  for (const VORBaseUnknown_var& o : *list) {
+    VORUnicodeString label;
+    VORIGENode_var(o)->GetLabel(label);
+    labels.push_back(label.ConvertToUTF8());
+  }
+  EXPECT_EQ(labels, (std::vector<std::string>{"A", "B", "C", "B", "D", "D", "C", "D", "D"}));
+  delete list;
+  organiser->RequestDelayedDestruction();
+  VORDeferredDeletion::Drain();
+}
+
+// --- The default-node-positions command around super nodes -----------------------------------
+
+TEST_F(ViewerTest, OrganiseLaysOutAgainAndReExpandsOnlyTheSuperNodesItCollapsed) {
+  auto a = Node(root, "A");
+  auto open = Node(root, "Open group", "BIWActivityGrouping");
+  auto shut = Node(root, "Shut group", "BIWActivityGrouping");
+  Node(open, "O1");
+  Node(open, "O2");
+  Node(shut, "C1");
+  Flow(a, open);
+  Flow(open, shut);
+  doc->GetDoor().SetPertNodeState(open, PertNodeExpanded);
+  doc->GetDoor().SetPertNodeState(shut, PertNodeCollapsed);
+  Open();
+  ASSERT_TRUE(OpenViewerOn("Line"));
+  QELPertController* controller = Viewer()->GetPertController();
+  EXPECT_TRUE(controller->IsInChart(Find("O1")));
+  EXPECT_FALSE(controller->IsInChart(Find("C1")));
+  // Scatter the top level, then restore the default positions.
+  for (const char* label : {"A", "Open group", "Shut group"}) {
+    VORBaseUnknown_var node(Find(label));
+    QELIPertNode_var(node)->SetPosition(500.0, 500.0, 1);
+  }
+  ASSERT_TRUE(driver.StartCommand("QELFpaNodeOrganizeCmd")) << driver.LastError();
+  EXPECT_EQ(QELIPertNodeExt_var(Find("Open group"))->GetState(1), PertNodeExpanded);
+  EXPECT_EQ(QELIPertNodeExt_var(Find("Shut group"))->GetState(1), PertNodeCollapsed);
+  EXPECT_TRUE(controller->IsInChart(Find("O1")));
+  EXPECT_FALSE(controller->IsInChart(Find("C1")));
+  const double x0 = Snap(0.0);
+  EXPECT_EQ(Position("A"), (Point{x0, Snap(50.0)}));
+  EXPECT_EQ(Position("Open group"), (Point{Snap(x0 + 50.0), Snap(50.0)}));
+  // Running it twice works the same (the collapsed list starts empty again).
+  ASSERT_TRUE(driver.StartCommand("QELFpaNodeOrganizeCmd"));
+  EXPECT_EQ(QELIPertNodeExt_var(Find("Open group"))->GetState(1), PertNodeExpanded);
+  EXPECT_EQ(Position("A"), (Point{x0, Snap(50.0)}));
+}
+
+TEST_F(ViewerTest, OrganiseDoesNothingWithoutAViewerAsCurrentWindow) {
+  auto a = Node(root, "A");
+  doc->GetDoor().SetPertPosition(a, true, 300.0, 300.0);
+  Open();
+  ASSERT_TRUE(driver.StartCommand("QELFpaNodeOrganizeCmd")) << driver.LastError();
+  EXPECT_EQ(Position("A"), (Point{300.0, 300.0}));
+  EXPECT_EQ(driver.GetRunningCommand(), nullptr);
+}
+
+// --- The same story as a script ---------------------------------------------------------------
+
+TEST(ViewerScriptTest, OpeningOrganisingAndSwitchingLevelsAsAScript) {
+  TempDir dir;
+  const std::string document = dir.Path() + "/line.pprx";
+  ASSERT_EQ(SaveSampleLine(document), "");
+  ::setenv("SCENARIO_DOC", document.c_str(), 1);
+  std::string output;
+  FILE* pipe = ::popen(PFV_BINARY " script " VIEWER_DATA "/viewer_story.pfvs 2>&1", "r");
+  ASSERT_NE(pipe, nullptr);
+  char buffer[4096];
+  for (size_t n; (n = std::fread(buffer, 1, sizeof buffer, pipe)) > 0;)
+    output.append(buffer, n);
+  const int status = ::pclose(pipe);
+  for (size_t at = output.find(document); at != std::string::npos; at = output.find(document))
+    output.replace(at, document.size(), "${SCENARIO_DOC}");
+  std::string expected, error;
+  ASSERT_TRUE(VORReadFile(VIEWER_DATA "/viewer_story.expected", expected, error)) << error;
+  EXPECT_EQ(output, expected);
+  EXPECT_EQ(status, 0);
+}
