@@ -68,6 +68,25 @@ class QELFpaProductFlowViewer : public VORFrmWindow {
   void AddCallbacks();
   void RemoveCallbacks();
   void ContextCB(VORCommand*, VORNotification* notification, void*);
+  // --- model synchronisation, continued (ZitBlt work; QELFpaProductFlowViewerSync.cpp) ---
+  void AddCallBackOnRootProduct();
+  void AddCallbackOnMA();
+  void RemoveProductStructureCB();
+  void RemoveCammBackOnMA();
+  void ONPertNodeModification(VORCommand*, VORNotification* notification, void*);
+  void OnMAModifiedNotification(VORCommand*, VORNotification* notification, void*);
+  void OnProductModification(VORCommand*, VORNotification* notification, void*);
+  void FollowChildChange(VORNotification* notification);
+  void GetInverslyLinkedActs(VORListValVORBaseUnknown_var& out, const VORBaseUnknown_var& assembly);
+  void GetAllParentActivities(VORListValVORBaseUnknown_var& acts,
+                              VORListValVORBaseUnknown_var& out);
+  void ContextMenuFor3DWindow(VORNotification* notification);
+  void GetSelectedElement(VORBaseUnknown_var& out);
+  VORCallbackId _pertNodeCallback = 0;
+  VORCallbackId _rootProductCallback = 0;
+  int _maCallback = -1;
+  VORHandle<VOREventPublisher> _maPublisher;
+  // --- end of the model synchronisation declarations ---
 
   VORHandle<QELPertViewer> _viewer;
   VORDlgFrame* _windowFrame = nullptr;
