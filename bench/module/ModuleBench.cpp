@@ -1,0 +1,225 @@
+// The node organiser side by side with a plain layered layout, the whole ArrangeNodes on a
+// viewer, and opening the viewer, on generated line-shaped levels. Run with VORStartupPath set
+// to resources/ and VOR_MODULE_PATH to the build's lib/ (the viewer command is loaded by name).
+#include <benchmark/benchmark.h>
+
+#include <algorithm>
+#include <cmath>
+#include <cstdlib>
+#include <string>
+#include <vector>
+
+#include "QELFpaProductFlowViewer.h"
+#include "QELPFVLayoutCore.h"
+#include "QELPFVNodeOrganiser.h"
+#include "QELPertClientVisuServices.h"
+#include "VORDeferredDeletion.h"
+#include "VORDocument.h"
+#include "VORDriver.h"
+#include "VORFileIO.h"
+#include "VORModelDoor.h"
+
+namespace {
+
+// A line as planners store it: kLanes parallel lanes of stations, lane after lane, each station
+// leading to the next one of its lane and, every tenth station, also to the next station of the
+// neighbouring lane (lanes that exchange parts meet on equal levels, so nothing is cyclic).
+constexpr int kLanes = 4;
+
+QELPFVLayoutCore::Successors LineSuccessors(int n) {
+  const int length = n / kLanes;
+  QELPFVLayoutCore::Successors succ(static_cast<size_t>(length * kLanes));
+  auto id = [length](int lane, int step) { return lane * length + step; };
+  for (int lane = 0; lane < kLanes; ++lane) {
+    for (int step = 0; step + 1 < length; ++step) {
+      auto& s = succ[static_cast<size_t>(id(lane, step))];
+      s.push_back(id(lane, step + 1));
+      if (step % 10 == 9)
+        s.push_back(id((lane + 1) % kLanes, step + 1));
+    }
+  }
+  return succ;
+}
+
+double Snap(double v) {
+  double x = v;
+  double y = 0.0;
+  QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 1, QELIPertNode_var());
+  return x;
+}
+
+// The organiser's computation on indexes: levels, exchange-sort order, level lists, the square
+// and the snapped column positions (as ArrangeNodes computes them, without writing them).
+void BM_OrganiserComputation(benchmark::State& state) {
+  const QELPFVLayoutCore::Successors succ = LineSuccessors(static_cast<int>(state.range(0)));
+  std::vector<double> xs(succ.size());
+  std::vector<double> ys(succ.size());
+  for (auto _ : state) {
+    const QELPFVLayoutCore::Levels levels = QELPFVLayoutCore::ComputeLevels(succ);
+    const std::vector<int> order = QELPFVLayoutCore::ExchangeSortOrder(levels.level);
+    const auto lists = QELPFVLayoutCore::LevelLists(succ, levels.level, order);
+    const float side = QELPFVLayoutCore::ChartSide(levels.level);
+    const int highest = static_cast<int>(lists.size()) - 1;
+    const float xStep = highest > 0 ? side / static_cast<float>(highest) : 0.0f;
+    double x = 0.0;
+    double y = 0.0;
+    for (const auto& list : lists) {
+      const float yStep = list.empty() ? 0.0f : side / static_cast<float>(list.size());
+      if (!list.empty())
+        y = side / static_cast<float>(2 * list.size());
+      for (int node : list) {
+        QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 1, QELIPertNode_var());
+        xs[static_cast<size_t>(node)] = x;
+        ys[static_cast<size_t>(node)] = y;
+        y += yStep;
+      }
+      x += xStep;
+    }
+    benchmark::DoNotOptimize(xs.data());
+    benchmark::DoNotOptimize(ys.data());
+  }
+  state.SetItemsProcessed(state.iterations() * state.range(0));
+}
+
+// A plain O(N + E) layered layout of the same graph: longest-path levels in topological order
+// (Kahn), nodes spread evenly in their column in index order, snapped the same way.
+void BM_PlainLongestPathLayering(benchmark::State& state) {
+  const QELPFVLayoutCore::Successors succ = LineSuccessors(static_cast<int>(state.range(0)));
+  const size_t n = succ.size();
+  std::vector<double> xs(n);
+  std::vector<double> ys(n);
+  for (auto _ : state) {
+    std::vector<int> indegree(n, 0);
+    for (const auto& s : succ)
+      for (int t : s)
+        ++indegree[static_cast<size_t>(t)];
+    std::vector<int> queue;
+    queue.reserve(n);
+    for (size_t i = 0; i < n; ++i)
+      if (indegree[i] == 0)
+        queue.push_back(static_cast<int>(i));
+    std::vector<int> level(n, 0);
+    for (size_t head = 0; head < queue.size(); ++head) {
+      const int v = queue[head];
+      for (int t : succ[static_cast<size_t>(v)]) {
+        level[static_cast<size_t>(t)] =
+            std::max(level[static_cast<size_t>(t)], level[static_cast<size_t>(v)] + 1);
+        if (--indegree[static_cast<size_t>(t)] == 0)
+          queue.push_back(t);
+      }
+    }
+    const int highest = *std::max_element(level.begin(), level.end());
+    std::vector<int> count(static_cast<size_t>(highest) + 1, 0);
+    for (int l : level)
+      ++count[static_cast<size_t>(l)];
+    const int widest = *std::max_element(count.begin(), count.end());
+    const double side = 50.0 * std::max(highest, widest);
+    std::vector<int> row(count.size(), 0);
+    for (size_t i = 0; i < n; ++i) {
+      const size_t l = static_cast<size_t>(level[i]);
+      xs[i] = Snap(highest > 0 ? side / highest * static_cast<double>(l) : 0.0);
+      ys[i] = Snap(side / count[l] * (row[l]++ + 0.5));
+    }
+    benchmark::DoNotOptimize(xs.data());
+    benchmark::DoNotOptimize(ys.data());
+  }
+  state.SetItemsProcessed(state.iterations() * state.range(0));
+}
+
+// A process document whose root holds a generated line of n stations.
+VORProcess_var MakeLineDocument(int n) {
+  VORProcess_var doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
+  VORBaseUnknown_var root = doc->GetRootProcess();
+  const QELPFVLayoutCore::Successors succ = LineSuccessors(n);
+  std::vector<VORBaseUnknown_var> nodes(succ.size());
+  for (size_t i = 0; i < succ.size(); ++i) {
+    doc->GetDoor().CreateNode(root, "BIWActivityStation", nodes[i]);
+    doc->GetDoor().SetLabel(nodes[i], VORUnicodeString("S" + std::to_string(i + 1)));
+  }
+  for (size_t i = 0; i < succ.size(); ++i)
+    for (int t : succ[i])
+      doc->GetDoor().AddFlow(nodes[i], nodes[static_cast<size_t>(t)]);
+  return doc;
+}
+
+const std::string& LineFile(int n) {
+  static std::string file;
+  if (file.empty()) {
+    file = "/tmp/pfv-module-bench-line-" + std::to_string(n) + ".pprx";
+    std::string error;
+    MakeLineDocument(n)->SaveAs(file, error);
+  }
+  return file;
+}
+
+QELFpaProductFlowViewer* FindViewer() {
+  for (VORFrmWindow* w : VORFrmLayout::GetCurrentLayout()->GetWindowList())
+    if (w->IsAKindOf(QELFpaProductFlowViewer::ClassName()))
+      return static_cast<QELFpaProductFlowViewer*>(w);
+  return nullptr;
+}
+
+// The whole ArrangeNodes on an open viewer: positions written to the document, chart boxes and
+// links refreshed, one position notification per node.
+void BM_ArrangeNodesWithRefresh(benchmark::State& state) {
+  VORDriver driver;
+  if (!driver.OpenDocument(LineFile(static_cast<int>(state.range(0)))) ||
+      !driver.PickObject("Line") || !driver.StartCommand("QELFpaProductFlowViewerCmd") ||
+      FindViewer() == nullptr) {
+    state.SkipWithError(("cannot open the viewer: " + driver.LastError()).c_str());
+    return;
+  }
+  QELFpaProductFlowViewer* viewer = FindViewer();
+  for (auto _ : state) {
+    auto* organiser = new QELPFVNodeOrganiser();
+    benchmark::DoNotOptimize(
+        organiser->ArrangeNodes(viewer->GetRootNode(), viewer->GetPertController()));
+    organiser->RequestDelayedDestruction();
+    VORDeferredDeletion::Drain();
+  }
+  state.SetItemsProcessed(state.iterations() * state.range(0));
+}
+
+// Picking the level and running the viewer command: window, viewer, controller with every node
+// box and link, and the first layout of all (new) nodes.
+void BM_OpenViewer(benchmark::State& state) {
+  VORDriver driver;
+  if (!driver.OpenDocument(LineFile(static_cast<int>(state.range(0))))) {
+    state.SkipWithError(driver.LastError().c_str());
+    return;
+  }
+  VORProcess* doc = driver.GetDocument();
+  VORListValVORBaseUnknown_var* children = nullptr;
+  VORIGENode_var(doc->GetRootProcess())->GetChildren(children);
+  driver.PickObject("Line");
+  for (auto _ : state) {
+    if (!driver.StartCommand("QELFpaProductFlowViewerCmd") || FindViewer() == nullptr) {
+      state.SkipWithError(driver.LastError().c_str());
+      break;
+    }
+    state.PauseTiming();
+    FindViewer()->DeleteWindow();
+    driver.DrainDeferred();
+    for (VORBaseUnknown_var& child : *children)  // new nodes again on the next opening
+      doc->GetDoor().SetPertPosition(child, false, 0.0, 0.0);
+    state.ResumeTiming();
+  }
+  delete children;
+}
+
+}  // namespace
+
+BENCHMARK(BM_OrganiserComputation)
+    ->Arg(1000)
+    ->Arg(20000)
+    ->Arg(100000)
+    ->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_PlainLongestPathLayering)
+    ->Arg(1000)
+    ->Arg(20000)
+    ->Arg(100000)
+    ->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_ArrangeNodesWithRefresh)->Arg(10000)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_OpenViewer)->Arg(10000)->Unit(benchmark::kMillisecond)->Iterations(5);
+
+BENCHMARK_MAIN();
