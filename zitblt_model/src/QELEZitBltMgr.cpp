@@ -29,6 +29,20 @@ bool IsStatusBar(const VORUnicodeString& name) {
 }
 }  // namespace
 
+namespace {
+// The node's centre as the chart draws it: its placed position, or the provisional one the chart
+// gave a node that was never placed. False when the activity is no PERT node.
+bool NodeGeometry(VORBaseUnknown* activity, double& x, double& y, double& w, double& h) {
+  QELIPertNode_var node{VORBaseUnknown_var(activity)};
+  if (!node)
+    return false;
+  if (node->GetPosition(x, y, 1) == S_FALSE)
+    node->GetPosition(x, y, 0);
+  node->GetSize(w, h);
+  return true;
+}
+}  // namespace
+
 QELEZitBltMgr::~QELEZitBltMgr() {
   for (auto& entry : _zitBlts)
     VORCommandDeletion(entry.second);
@@ -93,12 +107,8 @@ int QELEZitBltMgr::BuildZitBltReps(VORViewer* viewer) {
     BuildZitBlts();
     _initialised = true;
   }
-  QELIPertNode_var node{VORBaseUnknown_var(GetExtendedObject())};
   double x = 0.0, y = 0.0, w = 0.0, h = 0.0;
-  if (node) {
-    node->GetPosition(x, y);
-    node->GetSize(w, h);
-  }
+  NodeGeometry(GetExtendedObject(), x, y, w, h);
   _lastX = x;
   _lastY = y;
   _lastWidth = w;
@@ -231,12 +241,9 @@ HRESULT QELEZitBltMgr::RemoveZitBlts() {
 }
 
 void QELEZitBltMgr::UpdateZitBltPositions() {
-  QELIPertNode_var node{VORBaseUnknown_var(GetExtendedObject())};
-  if (!node)
-    return;
   double x = 0.0, y = 0.0, w = 0.0, h = 0.0;
-  node->GetPosition(x, y);
-  node->GetSize(w, h);
+  if (!NodeGeometry(GetExtendedObject(), x, y, w, h))
+    return;
   if (_lastX == 0.0 && _lastY == 0.0) {
     // Never placed: only remember the geometry.
     _lastX = x;
