@@ -134,10 +134,13 @@ void BruteForce(VOR2DRep* rep, const VOR3x3Matrix& toModel, std::vector<VOR2DRep
 }
 
 TEST_F(PickTest, CulledPickingMatchesAPlainScanOnGeneratedScenes) {
+  // Even scenes pick by scanning the children, odd ones through the bags' grid index.
+  const int threshold = VOR2DBagRep::GetIndexThreshold();
   std::mt19937 random(42);
   std::uniform_real_distribution<float> coord(-50.0f, 50.0f);
   std::uniform_real_distribution<double> angle(0.0, 6.28);
   for (int scene = 0; scene < 20; ++scene) {
+    VOR2DBagRep::SetIndexThreshold(scene % 2 == 0 ? 1000 : 4);
     auto root = Make<VOR2DBagRep>();
     for (int i = 0; i < 30; ++i) {
       auto bag = Make<VOR2DBagRep>();
@@ -165,7 +168,16 @@ TEST_F(PickTest, CulledPickingMatchesAPlainScanOnGeneratedScenes) {
       for (size_t k = 0; k < fast.size(); ++k)
         EXPECT_EQ(fast[k].reps, slow[k]);
     }
+    // A change after the first pick must reach the index.
+    VOR2DRep* moved = root->GetChild(3);
+    static_cast<VOR2DBagRep*>(moved)->SetMatrix(VOR3x3Matrix::Translation(500.0, 500.0));
+    std::vector<VORPickHit> hits;
+    std::vector<VOR2DRep*> chain;
+    root->CollectPicks({500.0 + 0.5, 500.0 + 0.5}, 50.0, chain, hits);
+    ASSERT_FALSE(hits.empty());
+    EXPECT_EQ(hits[0].reps[1], moved);
   }
+  VOR2DBagRep::SetIndexThreshold(threshold);
 }
 
 }  // namespace

@@ -15,9 +15,14 @@
 #include "VOR2DCustomRep.h"
 #include "VOR2DManipulator.h"
 #include "VORCommand.h"
+#include "VORIGENode.h"
+#include "VORIGraphNodeLayout.h"
+#include "VORIModelEvents.h"
+#include "VORISPPFlowMgt.h"
 #include "VORViewer.h"
 
 class VORFrmWindow;
+class QELEPertNodeExt;
 
 class QELPertController : public VORCommand {
   VOR_DECLARE_CLASS(QELPertController, VORCommand)
@@ -71,6 +76,11 @@ class QELPertController : public VORCommand {
   struct Link;
   struct Node {
     VORBaseUnknown_var object;
+    // The node's interfaces, asked once: casts are the dear part of drawing a node.
+    VORIGENode_var graph;
+    VORIGraphNodeLayout_var layout;
+    VORISPPFlowMgt_var flow;
+    QELEPertNodeExt* ext = nullptr;  // data extension: lives as long as the object
     VOR2DBagRep_var bag;
     Level* level = nullptr;        // the level the node is drawn in
     std::unique_ptr<Level> inner;  // set while the inner chart is shown
@@ -115,6 +125,7 @@ class QELPertController : public VORCommand {
   VORFrmWindow* _window;
   VORViewer_var _viewer;  // held: the chart rep must be taken out of it at the end
   VORBaseUnknown_var _root;
+  VORIModelEvents_var _rootEvents;
   ViewerName _name;
   ViewerMode _mode;
   bool _editable;

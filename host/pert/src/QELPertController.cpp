@@ -22,14 +22,6 @@ VORBaseUnknown* Key(VORBaseUnknown* object) {
   return object ? object->GetIdentity() : nullptr;
 }
 
-VORUnicodeString LabelOf(VORBaseUnknown* object) {
-  VORIGENode_var node(object);
-  VORUnicodeString label;
-  if (node)
-    node->GetLabel(label);
-  return label;
-}
-
 std::vector<VORMathPoint2Df> BoxPoints(double w, double h) {
   const auto hw = static_cast<float>(w * 0.5);
   const auto hh = static_cast<float>(h * 0.5);
@@ -101,6 +93,7 @@ void QELPertController::SetWindowRootNode(VORBaseUnknown* root, VORBaseUnknown_v
   if (!_nodes.empty())
     RemoveAllPertNodes();
   _root = root ? root->GetIdentity() : nullptr;
+  _rootEvents = VORIModelEvents_var(_root);
   _top->owner = _root.get();
   if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(_root))
     ext->SetReference(_root);
@@ -128,7 +121,7 @@ int QELPertController::GetLinkCount() const {
 }
 
 void QELPertController::ReadPosition(Node* node) {
-  QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object);
+  QELEPertNodeExt* ext = node->ext;
   double x = 0.0;
   double y = 0.0;
   if (ext != nullptr && ext->GetPosition(x, y, 1) != S_OK && ext->HasProvisionalPosition())
@@ -161,6 +154,10 @@ QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Leve
   Node* node = owned.get();
   node->object = Key(object);
   node->level = level;
+  node->graph = VORIGENode_var(node->object);
+  node->layout = VORIGraphNodeLayout_var(node->object);
+  node->flow = VORISPPFlowMgt_var(node->object);
+  node->ext = QELEPertNodeExt::Of(node->object);
   _nodes.emplace(Key(object), std::move(owned));
   level->members.push_back(node);
   ReadPosition(node);
@@ -174,7 +171,7 @@ QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Leve
   box->SetColorIndex(QELPertParameters::NodeBorderColor);
   node->bag->AddChild(box);
   auto label = VORHandle<VOR2DTextRep>::Adopt(new VOR2DTextRep(
-      LabelOf(object), VORMathPoint2Df(), 2, QELPertParameters::PERT_LABEL_HEIGHT));
+      VORUnicodeString(), VORMathPoint2Df(), 2, QELPertParameters::PERT_LABEL_HEIGHT));
   label->SetTag("PertLabel");
   label->SetColorIndex(QELPertParameters::NodeBorderColor);
   node->bag->AddChild(label);
@@ -182,19 +179,17 @@ QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Leve
   if (_manipulator)
     _manipulator->AddElement(node->bag);
 
-  if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(object)) {
-    ext->SetReference(_root);
-    ext->SetHiddenFlag(false);
+  if (node->ext != nullptr) {
+    node->ext->SetReference(_root);
+    node->ext->SetHiddenFlag(false);
   }
   BuildShape(node);
   PlaceNode(node);
   AddLinksOf(node);
   Announce(object, 0);
 
-  QELIPertNodeExt_var ext(object);
-  if (ext && ext->GetState(1) == PertNodeExpanded) {
+  if (node->layout && node->layout->GetPertNodeState() == PertNodeExpanded)
     ShowInnerNodes(object);
-  }
   return node;
 }
 
@@ -202,29 +197,23 @@ void QELPertController::BuildShape(Node* node) {
   const double labelHeight = QELPertParameters::PERT_LABEL_HEIGHT;
   auto* box = static_cast<VOR2DPolygonRep*>(node->bag->GetChild(1));
   auto* label = static_cast<VOR2DTextRep*>(node->bag->GetChild(2));
-  const VORUnicodeString text = LabelOf(node->object);
+  VORUnicodeString text;
+  if (node->graph)
+    node->graph->GetLabel(text);
   label->SetText(text);
   label->SetHeight(labelHeight);
 
+  // The document's size when it has one, else the default widened for the label.
   double w = 0.0;
   double h = 0.0;
-  {
-    QELIPertNode_var pertNode(node->object);
-    QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object);
-    if (ext)
-      ext->SetDrawnSize(0.0, 0.0);  // read the document's size, not the last drawing
-    if (pertNode)
-      pertNode->GetSize(w, h);
-    const bool documentSize =
-        w != QELPertParameters::PERT_NODE_WIDTH || h != QELPertParameters::PERT_NODE_HEIGHT;
-    if (!documentSize) {
-      const double labelWidth = VORTextMetric::TextWidth(text.GetLengthInChar(), labelHeight);
-      w = std::max(w, labelWidth + 2.0 * labelHeight);
-    }
+  if (node->layout)
+    node->layout->GetPertNodeSize(w, h);
+  if (w <= 0.0 || h <= 0.0) {
+    const double labelWidth = VORTextMetric::TextWidth(text.GetLengthInChar(), labelHeight);
+    w = std::max(QELPertParameters::PERT_NODE_WIDTH, labelWidth + 2.0 * labelHeight);
+    h = QELPertParameters::PERT_NODE_HEIGHT;
   }
-  int state = PertNodeNone;
-  if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object))
-    state = ext->GetState(1);
+  const int state = node->layout ? node->layout->GetPertNodeState() : PertNodeNone;
   double labelY = 0.0;
   if (node->inner && !node->inner->members.empty()) {
     // Enlarged box centred on the node, holding the inner chart and the label above it.
@@ -245,8 +234,8 @@ void QELPertController::BuildShape(Node* node) {
   // A super node (expanded or collapsed) has a double-weight border.
   box->SetLineThickness(state == PertNodeNone ? 1 : 2);
   label->Modify(VORMathPoint2Df(0.0f, static_cast<float>(labelY)));
-  if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object))
-    ext->SetDrawnSize(w, h);
+  if (node->ext != nullptr)
+    node->ext->SetDrawnSize(w, h);
 }
 
 void QELPertController::PlaceNode(Node* node) {
@@ -260,8 +249,8 @@ void QELPertController::PlaceNode(Node* node) {
 }
 
 void QELPertController::AddLinksOf(Node* node) {
-  VORISPPFlowMgt_var flow(node->object);
-  if (!flow)
+  VORISPPFlowMgt* flow = node->flow.get();
+  if (flow == nullptr)
     return;
   auto link = [this](Node* from, Node* to) {
     if (from == to || from->level != to->level)
@@ -327,8 +316,8 @@ void QELPertController::UpdateLink(Link* link) {
 }
 
 void QELPertController::Announce(VORBaseUnknown* node, int removeRep) {
-  VORIModelEvents_var events(_root);
-  if (!events)
+  VORIModelEvents* events = _rootEvents.get();
+  if (events == nullptr)
     return;
   auto notification = VORHandle<QELPertAppInfoNotify>::Adopt(
       new QELPertAppInfoNotify(VORBaseUnknown_var(node), nullptr, removeRep));
@@ -373,8 +362,8 @@ void QELPertController::ShiftInner(Node* node, double dx, double dy) {
   for (Node* m : node->inner->members) {
     m->x += dx;
     m->y += dy;
-    if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(m->object))
-      ext->SetPosition(m->x, m->y, 1);
+    if (m->ext != nullptr)
+      m->ext->SetPosition(m->x, m->y, 1);
     ShiftInner(m, dx, dy);
   }
 }
@@ -469,7 +458,7 @@ void QELPertController::RemoveNode(Node* node, bool announce) {
     _manipulator->RemoveElement(node->bag);
   level->nodes->RemoveChild(node->bag);
   VORBaseUnknown_var object = node->object;
-  if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(object)) {
+  if (QELEPertNodeExt* ext = node->ext) {
     ext->SetReference(nullptr);
     ext->SetDrawnSize(0.0, 0.0);
     ext->SetHiddenFlag(announce);
@@ -526,7 +515,7 @@ HRESULT QELPertController::RemoveChildNode(VORBaseUnknown_var& object) {
 
 void QELPertController::ClearChart() {
   for (auto& [key, node] : _nodes) {
-    if (QELEPertNodeExt* ext = QELEPertNodeExt::Of(key)) {
+    if (QELEPertNodeExt* ext = node->ext) {
       ext->SetReference(nullptr);
       ext->SetDrawnSize(0.0, 0.0);
       ext->SetHiddenFlag(false);
@@ -579,7 +568,7 @@ void QELPertController::OnManipulate(VORNotification* notification) {
   Node* node = DraggedNode();
   if (step == nullptr || node == nullptr)
     return;
-  QELEPertNodeExt* ext = QELEPertNodeExt::Of(node->object);
+  QELEPertNodeExt* ext = node->ext;
   if (ext == nullptr)
     return;
   ext->SetPosition(node->x + step->GetDelta().x, node->y + step->GetDelta().y, 1);

@@ -35,6 +35,11 @@ class VOR2DBagRep : public VOR2DRep {
   void ResetMatrix();
 
   bool HitTest(const VORMathPoint2D& p, double tolerance) const override;
+  // Bags with at least this many children pick through a grid index of their children's boxes
+  // (built on the first pick after a change) instead of testing every child; the order of the
+  // hits is the same.
+  static int GetIndexThreshold();
+  static void SetIndexThreshold(int children);
   void CollectPicks(const VORMathPoint2D& p, double tolerance, std::vector<VOR2DRep*>& chain,
                     std::vector<VORPickHit>& out) override;
 
@@ -48,7 +53,16 @@ class VOR2DBagRep : public VOR2DRep {
   // Point of the father's frame in the children's frame; false when the matrix is singular.
   bool ToLocal(const VORMathPoint2D& p, VORMathPoint2D& local, double& scale) const;
 
+  void BuildIndex() const;
+  // Positions (0-based) of the children whose box may hold p within tolerance, last first.
+  void Candidates(const VORMathPoint2D& p, double tolerance, std::vector<int>& out) const;
+
   std::vector<VOR2DRep_var> _children;
+  mutable VORBox2D _localBox;             // shown children, in the children's frame
+  mutable unsigned long _boxVersion = 0;  // bumped by each box computation
+  mutable unsigned long _indexVersion = 0;
+  mutable int _cells = 0;  // grid of _cells x _cells over _localBox
+  mutable std::vector<std::vector<int>> _index;
   VOR3x3Matrix _matrix;
   VOR3x3Matrix _inverse;
   bool _hasMatrix = false;

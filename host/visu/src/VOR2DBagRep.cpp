@@ -1,6 +1,8 @@
 #include "VOR2DBagRep.h"
 
 #include <algorithm>
+#include <cmath>
+#include <functional>
 
 #include "VORDeferredDeletion.h"
 
@@ -92,7 +94,86 @@ VORBox2D VOR2DBagRep::ComputeBoundingBox() const {
     if (child->IsShown())
       box.Extend(child->GetBoundingBox());
   }
+  _localBox = box;
+  ++_boxVersion;
   return _hasMatrix ? _matrix.TransformBox(box) : box;
+}
+
+namespace {
+int& IndexThreshold() {
+  static int threshold = 256;
+  return threshold;
+}
+}  // namespace
+
+int VOR2DBagRep::GetIndexThreshold() {
+  return IndexThreshold();
+}
+
+void VOR2DBagRep::SetIndexThreshold(int children) {
+  IndexThreshold() = children < 1 ? 1 : children;
+}
+
+void VOR2DBagRep::BuildIndex() const {
+  _indexVersion = _boxVersion;
+  _index.clear();
+  _cells = 0;
+  if (_localBox.IsEmpty())
+    return;
+  // About four children per cell when they are spread evenly.
+  const double n = static_cast<double>(_children.size());
+  _cells = std::clamp(static_cast<int>(std::ceil(std::sqrt(n / 4.0))), 1, 512);
+  _index.assign(static_cast<size_t>(_cells) * static_cast<size_t>(_cells), {});
+  const double cw = _localBox.Width() / _cells;
+  const double ch = _localBox.Height() / _cells;
+  auto cell = [this](double v, double origin, double size) {
+    if (!(size > 0.0))
+      return 0;
+    return std::clamp(static_cast<int>(std::floor((v - origin) / size)), 0, _cells - 1);
+  };
+  for (size_t i = 0; i < _children.size(); ++i) {
+    const VOR2DRep* child = _children[i].get();
+    if (!child->IsShown())
+      continue;
+    const VORBox2D b = child->GetBoundingBox();
+    if (b.IsEmpty())
+      continue;
+    const int x0 = cell(b.xmin, _localBox.xmin, cw);
+    const int x1 = cell(b.xmax, _localBox.xmin, cw);
+    const int y0 = cell(b.ymin, _localBox.ymin, ch);
+    const int y1 = cell(b.ymax, _localBox.ymin, ch);
+    for (int y = y0; y <= y1; ++y) {
+      for (int x = x0; x <= x1; ++x)
+        _index[static_cast<size_t>(y * _cells + x)].push_back(static_cast<int>(i));
+    }
+  }
+}
+
+void VOR2DBagRep::Candidates(const VORMathPoint2D& p, double tolerance,
+                             std::vector<int>& out) const {
+  out.clear();
+  if (_cells == 0 || !_localBox.Contains(p.x, p.y, tolerance))
+    return;
+  const double cw = _localBox.Width() / _cells;
+  const double ch = _localBox.Height() / _cells;
+  auto cell = [this](double v, double origin, double size) {
+    if (!(size > 0.0))
+      return 0;
+    return std::clamp(static_cast<int>(std::floor((v - origin) / size)), 0, _cells - 1);
+  };
+  const int x0 = cell(p.x - tolerance, _localBox.xmin, cw);
+  const int x1 = cell(p.x + tolerance, _localBox.xmin, cw);
+  const int y0 = cell(p.y - tolerance, _localBox.ymin, ch);
+  const int y1 = cell(p.y + tolerance, _localBox.ymin, ch);
+  for (int y = y0; y <= y1; ++y) {
+    for (int x = x0; x <= x1; ++x) {
+      const auto& bucket = _index[static_cast<size_t>(y * _cells + x)];
+      out.insert(out.end(), bucket.begin(), bucket.end());
+    }
+  }
+  // Front first, each child once.
+  std::sort(out.begin(), out.end(), std::greater<int>());
+  out.erase(std::unique(out.begin(), out.end()), out.end());
 }
 
 bool VOR2DBagRep::ToLocal(const VORMathPoint2D& p, VORMathPoint2D& local, double& scale) const {
@@ -133,9 +214,18 @@ void VOR2DBagRep::CollectPicks(const VORMathPoint2D& p, double tolerance,
     return;
   const double localTolerance = scale > 0.0 ? tolerance / scale : tolerance;
   chain.push_back(this);
-  // Last drawn is in front.
-  for (auto it = _children.rbegin(); it != _children.rend(); ++it)
-    (*it)->CollectPicks(local, localTolerance, chain, out);
+  if (static_cast<int>(_children.size()) >= IndexThreshold()) {
+    if (_indexVersion != _boxVersion)
+      BuildIndex();
+    std::vector<int> candidates;
+    Candidates(local, localTolerance, candidates);
+    for (int i : candidates)
+      _children[static_cast<size_t>(i)]->CollectPicks(local, localTolerance, chain, out);
+  } else {
+    // Last drawn is in front.
+    for (auto it = _children.rbegin(); it != _children.rend(); ++it)
+      (*it)->CollectPicks(local, localTolerance, chain, out);
+  }
   chain.pop_back();
 }
 
