@@ -79,4 +79,28 @@ TEST(EventPublisherTest, SubscriberTagsRemoveAllOfOneSubscriberAndIdsAreUnique) 
   EXPECT_EQ(a->AddCallback("E", nullptr), 0u);
 }
 
+TEST(EventPublisherTest, RemovingManyCallbacksOneByOneKeepsTheOthersInOrder) {
+  auto p = VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
+  std::vector<int> calls;
+  std::vector<VORCallbackId> ids;
+  for (int i = 0; i < 100; ++i)
+    ids.push_back(
+        p->AddCallback("E", [&calls, i](VORBaseUnknown*, const std::string&, VORNotification*,
+                                        void*, VORCallbackId) { calls.push_back(i); }));
+  for (int i = 1; i < 100; i += 2)
+    EXPECT_TRUE(p->RemoveCallback(ids[static_cast<size_t>(i)]));
+  EXPECT_FALSE(p->RemoveCallback(ids[1]));  // already gone
+  EXPECT_FALSE(p->RemoveCallback(12345678));
+  EXPECT_EQ(p->CallbackCount(), 50);
+  EXPECT_TRUE(p->HasCallback(ids[98]));
+  EXPECT_FALSE(p->HasCallback(ids[99]));
+  EXPECT_EQ(p->Dispatch("E"), 50);
+  ASSERT_EQ(calls.size(), 50u);
+  for (size_t k = 0; k < calls.size(); ++k)
+    EXPECT_EQ(calls[k], static_cast<int>(2 * k));
+  // Removal after a compaction still finds the survivors.
+  EXPECT_TRUE(p->RemoveCallback(ids[50]));
+  EXPECT_EQ(p->CallbackCount(), 49);
+}
+
 }  // namespace

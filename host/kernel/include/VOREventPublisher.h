@@ -50,4 +50,6 @@ class VOREventPublisher : public VORBaseUnknown {
   std::vector<Entry> _entries;
   VORBaseUnknown* _owner;
   int _dispatchDepth = 0;
+  size_t _removedCount = 0;  // entries flagged removed and not yet erased
+  void Compact();
 };

@@ -17,15 +17,23 @@ VORCallbackId VOREventPublisher::AddCallback(const std::string& name, VORCallbac
 }
 
 bool VOREventPublisher::RemoveCallback(VORCallbackId id) {
-  for (Entry& e : _entries) {
-    if (e.id == id && !e.removed) {
-      e.removed = true;
-      if (_dispatchDepth == 0)
-        std::erase_if(_entries, [](const Entry& x) { return x.removed; });
-      return true;
-    }
-  }
-  return false;
+  // Ids grow with every AddCallback and entries are appended, so they are sorted by id.
+  auto it = std::lower_bound(_entries.begin(), _entries.end(), id,
+                             [](const Entry& e, VORCallbackId v) { return e.id < v; });
+  if (it == _entries.end() || it->id != id || it->removed)
+    return false;
+  it->removed = true;
+  it->callback = nullptr;  // what the callback holds goes now (a running one was copied)
+  ++_removedCount;
+  // Erase in bulk once half the entries are gone: removing n callbacks one by one stays linear.
+  if (_dispatchDepth == 0 && _removedCount * 2 >= _entries.size())
+    Compact();
+  return true;
+}
+
+void VOREventPublisher::Compact() {
+  std::erase_if(_entries, [](const Entry& x) { return x.removed; });
+  _removedCount = 0;
 }
 
 int VOREventPublisher::RemoveCallbacksOf(const void* subscriber) {
@@ -33,11 +41,13 @@ int VOREventPublisher::RemoveCallbacksOf(const void* subscriber) {
   for (Entry& e : _entries) {
     if (!e.removed && e.subscriber == subscriber) {
       e.removed = true;
+      e.callback = nullptr;
+      ++_removedCount;
       ++count;
     }
   }
-  if (_dispatchDepth == 0)
-    std::erase_if(_entries, [](const Entry& x) { return x.removed; });
+  if (_dispatchDepth == 0 && _removedCount > 0)
+    Compact();
   return count;
 }
 
@@ -61,8 +71,8 @@ int VOREventPublisher::Dispatch(const std::string& event, VORNotification* notif
     callback(_owner ? _owner : this, event, notification, _entries[i].clientData, _entries[i].id);
     ++called;
   }
-  if (--_dispatchDepth == 0)
-    std::erase_if(_entries, [](const Entry& x) { return x.removed; });
+  if (--_dispatchDepth == 0 && _removedCount > 0)
+    Compact();
   return called;
 }
 
