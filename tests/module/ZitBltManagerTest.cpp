@@ -74,6 +74,7 @@ class ZitBltManagerTest : public ::testing::Test {
     VORDeferredDeletion::Drain();
     QELZitBltConfiguration::ForgetForTests();
     QELBaseListZitBltCmd::ForgetStatusBarConfigurationForTests();
+    QELZitBltRep::ForgetIcons();
     EXPECT_EQ(VORBaseUnknown::LiveInstances(), _live) << "leaked objects";
   }
   VORBaseUnknown_var Node(VORBaseUnknown* father, const char* label, const char* type, double x,

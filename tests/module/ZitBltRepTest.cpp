@@ -20,6 +20,7 @@ class ZitBltRepTest : public ::testing::Test {
       rep->RequestDelayedDestruction();
     reps.clear();
     VORDeferredDeletion::Drain();
+    QELZitBltRep::ForgetIcons();
     EXPECT_EQ(VORBaseUnknown::LiveInstances(), _live) << "leaked objects";
   }
   QELZitBltRep* Make(const char* location, const char* icon = "I_Test") {
@@ -204,6 +205,23 @@ TEST_F(ZitBltRepTest, GreyIconAndMissingIconFile) {
   rep->SetZitbltButtonGrey(0);  // keeps what it had
   EXPECT_EQ(rep->GetZitBltBtn()->GetSize(), 1);
   EXPECT_EQ(rep->EmptyExpandedBagRep(), E_FAIL);
+}
+
+TEST_F(ZitBltRepTest, IconsDecodedOnceEqualTheFileReadDirectlyAndAreNotShared) {
+  QELZitBltRep* first = Make("lefttop");
+  QELZitBltRep* second = Make("righttop");
+  VORUnicodeString path;
+  ASSERT_EQ(VORGetImagePathName("I_Test.bmp", path), S_OK);
+  auto direct = VORPixelImage_var::Adopt(VORPixelImage::CreateFromFile(path, 0));
+  ASSERT_TRUE(direct);
+  direct->Convert(VORPixelImage::RGBA);
+  direct->SetTransparency(0);
+  EXPECT_EQ(Icon(first)->GetPixelImage()->GetPixels(), direct->GetPixels());
+  EXPECT_EQ(Icon(second)->GetPixelImage()->GetPixels(), direct->GetPixels());
+  EXPECT_EQ(Icon(second)->GetPixelImage()->GetWidth(), direct->GetWidth());
+  first->SetZitbltButtonGrey(1);  // converts its own copy only
+  EXPECT_EQ(Icon(second)->GetPixelImage()->GetPixels(), direct->GetPixels());
+  EXPECT_NE(Icon(first)->GetPixelImage()->GetPixels(), direct->GetPixels());
 }
 
 TEST_F(ZitBltRepTest, BagsJoinTheCurrentEditorsInteractiveSetUntilTheRepGoes) {

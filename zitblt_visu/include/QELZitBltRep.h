@@ -72,6 +72,9 @@ class QELZitBltRep : public VORCommand {
   bool IsVerticalLimitOn() const { return _verticalLimit != 0; }
   bool IsHorizontalLimitOn() const { return _horizontalLimit != 0; }
 
+  // Icons are decoded once per process; this forgets them (tests that count live objects).
+  static void ForgetIcons();
+
   // The base ZitBlt has no expanded content to empty: E_FAIL.
   HRESULT EmptyExpandedBagRep();
 

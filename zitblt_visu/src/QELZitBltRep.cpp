@@ -1,5 +1,7 @@
 #include "QELZitBltRep.h"
 
+#include <map>
+
 #include "VOR2DImagePixelRep.h"
 #include "VOR2DManipulator.h"
 #include "VORCommandHeader.h"
@@ -16,6 +18,34 @@ bool IsHorizontalEdge(const VORUnicodeString& location) {
       return true;
   }
   return false;
+}
+
+// Decoded icons by file name: every button gets its own copy (it is converted in place), but
+// the search along the start-up path and the decoding happen once per icon. Failures are not
+// kept, so an icon added later is found.
+std::map<VORUnicodeString, VORPixelImage_var>& IconCache() {
+  static std::map<VORUnicodeString, VORPixelImage_var> cache;
+  return cache;
+}
+
+// A new image (one reference, the caller's) for the icon file, or null.
+VORPixelImage* LoadIcon(const VORUnicodeString& fileName) {
+  auto& cache = IconCache();
+  auto it = cache.find(fileName);
+  if (it == cache.end()) {
+    VORUnicodeString path;
+    if (FAILED(VORGetImagePathName(fileName, path)))
+      return nullptr;
+    VORPixelImage_var image = VORPixelImage_var::Adopt(VORPixelImage::CreateFromFile(path, 0));
+    if (!image)
+      return nullptr;
+    it = cache.emplace(fileName, image).first;
+  }
+  const VORPixelImage& original = *it->second;
+  VORPixelImage* copy =
+      VORPixelImage::Create(original.GetWidth(), original.GetHeight(), original.GetFormat());
+  copy->Pixels() = original.GetPixels();
+  return copy;
 }
 
 VORISO* CurrentISO() {
@@ -52,6 +82,10 @@ void QELZitBltIconOffset(const VORUnicodeString& location, float w, float h, flo
   } else if (l == "bottommiddle") {
     oy = -hh;
   }
+}
+
+void QELZitBltRep::ForgetIcons() {
+  IconCache().clear();
 }
 
 QELZitBltRep::QELZitBltRep() : VORCommand(nullptr, "QELZitBltRep") {}
@@ -122,10 +156,7 @@ void QELZitBltRep::BuildRep(VORViewer* viewer) {
 void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
   if (!_btnBag)
     return;
-  VORUnicodeString path;
-  if (FAILED(VORGetImagePathName(_icon + VORUnicodeString(".bmp"), path)))
-    return;
-  VORPixelImage* image = VORPixelImage::CreateFromFile(path, 0);
+  VORPixelImage* image = LoadIcon(_icon + VORUnicodeString(".bmp"));
   if (image == nullptr)
     return;
   image->AddRef();
