@@ -1,9 +1,11 @@
-// pfv export <document> --activity <name or id> [--out chart.svg]: writes the PERT chart of the
-// activity's children as SVG (to standard output without --out).
+// pfv export <document> --activity <name or id> [--out chart.svg|chart.png]: writes the PERT chart
+// of the activity's children as SVG (to standard output without --out).
 #include <cstdio>
+#include <filesystem>
 #include <string>
 
 #include "PfvCommand.h"
+#include "PfvImageWriters.h"
 #include "QELPertChart.h"
 #include "QELPertViewer.h"
 #include "VORDeferredDeletion.h"
@@ -57,8 +59,9 @@ int RunExport(const std::vector<std::string>& args) {
     }
   }
   if (usage || document.empty() || activity.empty()) {
-    std::fprintf(stderr,
-                 "Usage: pfv export <document.pprx> --activity <name or id> [--out chart.svg]\n");
+    std::fprintf(
+        stderr,
+        "Usage: pfv export <document.pprx> --activity <name or id> [--out chart.svg|chart.png]\n");
     return 2;
   }
   std::string error;
@@ -83,10 +86,21 @@ int RunExport(const std::vector<std::string>& args) {
       std::fprintf(stderr, "pfv export: \"%s\" cannot be shown as a chart\n", activity.c_str());
       return 1;
     }
-    const std::string svg = VORSVGWriter::ToString(*viewer);
+    // Other formats than SVG come from the writers the build registers (PNG with the window).
+    const PfvImageWriter* writer = out.empty() ? nullptr : PfvFindImageWriter(out);
+    const std::string extension = std::filesystem::path(out).extension().string();
     if (out.empty()) {
+      const std::string svg = VORSVGWriter::ToString(*viewer);
       std::fwrite(svg.data(), 1, svg.size(), stdout);
-    } else if (!VORSVGWriter::WriteFile(*viewer, out, error)) {
+    } else if (writer == nullptr && !extension.empty() && extension != ".svg") {
+      std::string formats = "svg";
+      for (const std::string& e : PfvImageWriterExtensions())
+        formats += ", " + e;
+      std::fprintf(stderr, "pfv export: %s: unknown picture format (this build writes %s)\n",
+                   out.c_str(), formats.c_str());
+      status = 1;
+    } else if (writer != nullptr ? !(*writer)(*viewer, out, error)
+                                 : !VORSVGWriter::WriteFile(*viewer, out, error)) {
       std::fprintf(stderr, "pfv export: %s\n", error.c_str());
       status = 1;
     } else {
@@ -101,5 +115,5 @@ int RunExport(const std::vector<std::string>& args) {
 
 }  // namespace
 
-PFV_COMMAND(export, "export", "<document.pprx> --activity <name or id> [--out chart.svg]",
-            "write the PERT chart of an activity's children as SVG", RunExport);
+PFV_COMMAND(export, "export", "<document.pprx> --activity <name or id> [--out chart.svg|chart.png]",
+            "write the PERT chart of an activity's children as SVG (or PNG)", RunExport);

@@ -8,6 +8,7 @@
 #include <QMainWindow>
 #include <QPointer>
 #include <QStringList>
+#include <functional>
 #include <map>
 #include <memory>
 
@@ -96,6 +97,7 @@ class VORQtMainWindow : public QMainWindow {
   struct MdiEntry {
     VORFrmWindow_var window;
     QPointer<QMdiSubWindow> sub;
+    std::function<void()> cleanup;  // what the shell built for the window, undone at its end
   };
   std::map<VORFrmWindow*, MdiEntry> _windows;
   VORDocument* _treeDocument = nullptr;

@@ -34,8 +34,9 @@ QImage Render(const VORRenderList& list, float r, float g, float b, const Option
   const double longest = std::max(box.Width(), box.Height()) * ppu;
   if (longest > options.maxPixels)
     ppu *= options.maxPixels / longest;
-  const int width = std::max(1, static_cast<int>(std::ceil(box.Width() * ppu)));
-  const int height = std::max(1, static_cast<int>(std::ceil(box.Height() * ppu)));
+  const int limit = std::max(1, options.maxPixels);
+  const int width = std::clamp(static_cast<int>(std::ceil(box.Width() * ppu)), 1, limit);
+  const int height = std::clamp(static_cast<int>(std::ceil(box.Height() * ppu)), 1, limit);
   QImage image(width, height, QImage::Format_ARGB32_Premultiplied);
   if (image.isNull())
     return image;

@@ -4,6 +4,8 @@
 #include <QActionGroup>
 #include <QApplication>
 #include <QCloseEvent>
+#include <QMoveEvent>
+#include <QResizeEvent>
 #include <QDockWidget>
 #include <QFileDialog>
 #include <QFileInfo>
@@ -18,6 +20,7 @@
 #include <QPlainTextEdit>
 #include <QProgressDialog>
 #include <QStatusBar>
+#include <QTimer>
 #include <QToolBar>
 
 #include "VORCommandEngine.h"
@@ -36,6 +39,12 @@
 #include "VORViewer.h"
 #include "VORWorkbench.h"
 
+#if __has_include("QELPertChart.h")
+#include "QELPertChart.h"
+#include "QELPertViewer.h"
+#define PFV_QT_WITH_PERT 1
+#endif
+
 namespace {
 
 // An MDI window showing one frame window; closing it deletes the frame window.
@@ -53,6 +62,19 @@ class VORQtMdiWindow : public QMdiSubWindow {
     if (_window && !_window->IsDeleted())
       _window->DeleteWindow();
     QMdiSubWindow::closeEvent(event);
+  }
+  // The frame window knows its place (its title is shortened to its width).
+  void resizeEvent(QResizeEvent* event) override {
+    QMdiSubWindow::resizeEvent(event);
+    TellRectangle();
+  }
+  void moveEvent(QMoveEvent* event) override {
+    QMdiSubWindow::moveEvent(event);
+    TellRectangle();
+  }
+  void TellRectangle() {
+    if (_window && !_window->IsDeleted())
+      _window->SetRectangle(VORRectangle{x(), y(), width(), height()});
   }
 
  private:
@@ -167,6 +189,8 @@ VORQtMainWindow::~VORQtMainWindow() {
   for (auto& [window, entry] : _windows) {
     if (entry.sub)
       delete entry.sub;
+    if (entry.cleanup)
+      entry.cleanup();
   }
   _windows.clear();
   delete _dialogs;
@@ -461,6 +485,23 @@ void VORQtMainWindow::UpdateWindowMenu() {
 }
 
 QWidget* VORQtMainWindow::MakeWindowWidget(VORFrmWindow* window) {
+#ifdef PFV_QT_WITH_PERT
+  // The classic chart window keeps no viewer of its own: it gets the graph editor's chart of
+  // its level, drawn as the export draws it, so that it can be seen and picked in.
+  if (auto* chart = dynamic_cast<QELFpaPertChartWindow*>(window);
+      chart != nullptr && ViewerOf(window) == nullptr) {
+    auto viewer = VORHandle<QELPertViewer>::Adopt(new QELPertViewer(
+        window->GetViewerFrame(), "PERT Chart", QELPertParameters::PERT_VIEWER_STYLE, 800, 500,
+        QELPertParameters::PERT_VIEWER_FLAGS));
+    auto controller = VORHandle<QELPertController>::Adopt(
+        QELPertBuildChart(chart->GetChartRoot(), viewer, PertModeEditable));
+    if (controller) {
+      viewer->SetViewerSelectable(true);
+      window->SetViewer(viewer);
+      _windows[window].cleanup = [controller]() { controller->RemoveAllPertNodes(); };
+    }
+  }
+#endif
   if (VORViewer* viewer = ViewerOf(window)) {
     auto* widget = new VORQtViewerWidget(viewer);
     widget->setObjectName(VORQtString(window->GetName()) + "Viewer");
@@ -475,6 +516,8 @@ QWidget* VORQtMainWindow::MakeWindowWidget(VORFrmWindow* window) {
 
 void VORQtMainWindow::SyncWindows() {
   VORFrmLayout* layout = VORFrmLayout::GetCurrentLayout();
+  const QRect client = _mdi->viewport()->rect();
+  layout->SetClientArea(VORRectangle{0, 0, client.width(), client.height()});
   const std::vector<VORFrmWindow*> windows = layout->GetWindowList();
   for (auto it = _windows.begin(); it != _windows.end();) {
     VORFrmWindow* window = it->first;
@@ -485,6 +528,8 @@ void VORQtMainWindow::SyncWindows() {
     }
     if (it->second.sub)
       delete it->second.sub;
+    if (it->second.cleanup)
+      it->second.cleanup();
     it = _windows.erase(it);
   }
   for (VORFrmWindow* window : windows) {
@@ -497,11 +542,23 @@ void VORQtMainWindow::SyncWindows() {
       entry.window = window;
       sub = new VORQtMdiWindow(window);
       sub->setWidget(MakeWindowWidget(window));
-      sub->hasViewer = hasViewer;
+      sub->hasViewer = ViewerOf(window) != nullptr;
       _mdi->addSubWindow(sub);
       sub->resize(std::max(400, _mdi->width() * 3 / 4), std::max(300, _mdi->height() * 3 / 4));
-      sub->show();
+      // The layout's MDI state says how a new window is placed.
+      if (layout->GetMDIState() == VORFrmLayout::MDIMaximized) {
+        sub->showMaximized();
+      } else {
+        sub->show();
+        if (layout->GetMDIState() == VORFrmLayout::MDITiled)
+          _mdi->tileSubWindows();
+      }
       entry.sub = sub;
+      // A chart opens framed on its whole scene (again once the window has its final size).
+      if (auto* viewer = qobject_cast<VORQtViewerWidget*>(sub->widget())) {
+        viewer->FitAll();
+        QTimer::singleShot(0, viewer, [viewer]() { viewer->FitAll(); });
+      }
     } else if (sub->hasViewer != hasViewer) {
       sub->setWidget(MakeWindowWidget(window));
       sub->hasViewer = hasViewer;
@@ -613,7 +670,7 @@ void VORQtMainWindow::RestoreGeometry() {
   if (SUCCEEDED(settings->ReadSetting("Geometry", geometry)))
     restoreGeometry(QByteArray::fromBase64(VORQtString(geometry).toLatin1()));
   else
-    resize(1280, 800);
+    resize(1400, 880);
   if (SUCCEEDED(settings->ReadSetting("WindowState", state)))
     restoreState(QByteArray::fromBase64(VORQtString(state).toLatin1()));
 }
