@@ -1,5 +1,9 @@
 #include "VORBaseUnknown.h"
 
+#include <cstddef>
+#include <string_view>
+#include <typeindex>
+#include <unordered_map>
 #include <utility>
 #include <vector>
 
@@ -9,7 +13,39 @@
 
 namespace {
 long liveInstances = 0;
+
+// Answers of interface casts per (complete type, interface): where the interface sits from the
+// start of the complete object, or kNoInterface. Offsets are fixed per complete type, so the
+// costly dynamic_cast (which compares type names across shared libraries) runs once per pair.
+constexpr std::ptrdiff_t kNoInterface = PTRDIFF_MIN;
+struct CastKey {
+  std::type_index type;
+  std::string_view iid;
+  bool operator==(const CastKey&) const = default;
+};
+struct CastKeyHash {
+  size_t operator()(const CastKey& k) const noexcept {
+    return k.type.hash_code() * 31u + std::hash<std::string_view>()(k.iid);
+  }
+};
+
+void* CachedCast(VORBaseUnknown* object, const VORInterfaceId& iid) {
+  // The base interface answers the identity, which is no fixed offset for extensions.
+  if (iid.name == VORBaseUnknown::IID().name)
+    return iid.cast(object);
+  // Never destroyed: casts may run while statics of other libraries are torn down.
+  static auto* answers = new std::unordered_map<CastKey, std::ptrdiff_t, CastKeyHash>();
+  auto* complete = static_cast<char*>(dynamic_cast<void*>(object));
+  const CastKey key{std::type_index(typeid(*object)), iid.name};
+  auto it = answers->find(key);
+  if (it == answers->end()) {
+    void* seen = iid.cast(object);
+    const std::ptrdiff_t offset = seen ? static_cast<char*>(seen) - complete : kNoInterface;
+    it = answers->emplace(key, offset).first;
+  }
+  return it->second == kNoInterface ? nullptr : complete + it->second;
 }
+}  // namespace
 
 // The data extensions of one object, created on first query.
 class VORExtensionSet {
@@ -60,7 +96,7 @@ unsigned long VORBaseUnknown::Release() {
 
 HRESULT VORBaseUnknown::QueryInterface(const VORInterfaceId& iid, void** out) {
   *out = nullptr;
-  if (void* self = iid.cast(this)) {
+  if (void* self = CachedCast(this, iid)) {
     AddRef();
     *out = self;
     return S_OK;
@@ -82,7 +118,7 @@ HRESULT VORBaseUnknown::QueryInterface(const VORInterfaceId& iid, void** out) {
   } else {
     ext->AddRef();
   }
-  void* seen = iid.cast(ext);
+  void* seen = CachedCast(ext, iid);
   if (seen == nullptr) {
     ext->Release();
     return E_NOINTERFACE;
