@@ -134,6 +134,22 @@ std::vector<int> ExchangeSortOrder(const std::vector<int>& level) {
   return order;
 }
 
+std::vector<int> StableLevelOrder(const std::vector<int>& level) {
+  if (level.empty())
+    return {};
+  const int highest = *std::max_element(level.begin(), level.end());
+  const int lowest = *std::min_element(level.begin(), level.end());
+  std::vector<size_t> start(static_cast<size_t>(highest - lowest) + 2, 0);
+  for (int l : level)
+    ++start[static_cast<size_t>(l - lowest) + 1];
+  for (size_t v = 1; v < start.size(); ++v)
+    start[v] += start[v - 1];
+  std::vector<int> order(level.size());
+  for (size_t i = 0; i < level.size(); ++i)
+    order[start[static_cast<size_t>(level[i] - lowest)]++] = static_cast<int>(i);
+  return order;
+}
+
 std::vector<std::vector<int>> LevelLists(const Successors& successors,
                                          const std::vector<int>& level,
                                          const std::vector<int>& order) {

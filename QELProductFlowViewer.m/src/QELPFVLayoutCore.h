@@ -28,6 +28,13 @@ Levels ComputeLevels(const Successors& successors);
 // order[p] is the child index at 0-based position p afterwards.
 std::vector<int> ExchangeSortOrder(const std::vector<int>& level);
 
+// Children by level, each level in child order (a counting sort). The organiser's results only
+// depend on the order this gives to the lowest level, and there it equals the exchange sort's:
+// the exchange sort moves an element of the smallest value only to put it in its final place,
+// always the first one left, so that value keeps child order. Every later level list is rebuilt
+// from the previous one's successors (LevelLists), whatever order the sort left it in.
+std::vector<int> StableLevelOrder(const std::vector<int>& level);
+
 // Level lists after the sort (list v holds level v in sorted order), each list but the first then
 // replaced by the first-occurrence order of the previous list's successors that it holds.
 std::vector<std::vector<int>> LevelLists(const Successors& successors,

@@ -4,7 +4,6 @@
 #include <unordered_map>
 #include <unordered_set>
 
-#include "QELIPertNode.h"
 #include "QELIPertNodeExt.h"
 #include "QELIPertPosition.h"
 #include "QELPFVLayoutCore.h"
@@ -110,8 +109,11 @@ void QELPFVNodeOrganiser::ArrangeActAsPerLevel() {
   std::vector<int> level(static_cast<size_t>(n));
   for (int i = 1; i <= n; ++i)
     level[static_cast<size_t>(i - 1)] = (*_levelList)[i];
-  // The exchange sort's permutation, applied to both lists.
-  _order = QELPFVLayoutCore::ExchangeSortOrder(level);
+  // Sorted by level. The exchange sort would leave the higher levels in another order, but the
+  // level lists rebuild those from the lowest level, which both sorts leave in child order; so
+  // the organiser's results are the same, in linear time (the exchange sort's own order costs up
+  // to n x levels swaps on lines stored lane by lane).
+  _order = QELPFVLayoutCore::StableLevelOrder(level);
   VORListValVORBaseUnknown_var sorted;
   sorted.Reserve(n);
   for (int p = 0; p < n; ++p) {
@@ -201,8 +203,8 @@ bool QELPFVNodeOrganiser::ComputeLevels(VORBaseUnknown_var& root) {
   return true;
 }
 
-void QELPFVNodeOrganiser::SetNodePosition(VORBaseUnknown_var& node, double x, double y) {
-  QELIPertNode_var pertNode(node);
+void QELPFVNodeOrganiser::SetNodePosition(VORBaseUnknown_var& node,
+                                          const QELIPertNode_var& pertNode, double x, double y) {
   pertNode->SetPosition(x, y, 1);
   if (QELIPertNodeExt_var ext(node); ext)
     ext->SetPosition(x, y, 1);
@@ -243,12 +245,13 @@ bool QELPFVNodeOrganiser::ArrangeNodes(VORBaseUnknown_var root, QELPertControlle
       y = side / static_cast<float>(2 * count);
     }
     for (VORBaseUnknown_var& node : *list) {
-      if (!QELIPertNode_var(node))
+      const QELIPertNode_var pertNode(node);
+      if (!pertNode)
         continue;
       QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 1, noNode);
-      SetNodePosition(node, x, y);
+      SetNodePosition(node, pertNode, x, y);
       y += yStep;
-      DispatchNotif(node);
+      Announce(node, pertNode);
     }
     x += xStep;
   }
@@ -368,12 +371,13 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
         }
         x += xStep;
         for (VORBaseUnknown_var& node : *list) {
-          if (!QELIPertNode_var(node))
+          const QELIPertNode_var pertNode(node);
+          if (!pertNode)
             continue;
           QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 1, noNode);
           if (change.count(node.Identity()) != 0) {
-            SetNodePosition(node, x, y);
-            DispatchNotif(node);
+            SetNodePosition(node, pertNode, x, y);
+            Announce(node, pertNode);
           }
           y += yStep;
         }
@@ -385,11 +389,15 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
 }
 
 void QELPFVNodeOrganiser::DispatchNotif(VORBaseUnknown_var node) {
+  Announce(node, QELIPertNode_var(node));
+}
+
+void QELPFVNodeOrganiser::Announce(VORBaseUnknown_var& node, const QELIPertNode_var& pertNode) {
   if (!node)
     return;
   double x = 0.0;
   double y = 0.0;
-  if (QELIPertNode_var pertNode(node); pertNode)
+  if (pertNode)
     pertNode->GetPosition(x, y, 1);
   if (_controller != nullptr)
     _controller->RefreshNodePositionInPert(node, true);
@@ -398,12 +406,16 @@ void QELPFVNodeOrganiser::DispatchNotif(VORBaseUnknown_var node) {
     return;
   VORBaseUnknown_var reference;
   position->GetReferenceObject(reference);
-  VORIModelEvents_var events(reference);
-  if (!events)
+  // The nodes of one level share their reference object: its events are looked up once.
+  if (reference.Identity() != _eventsOf) {
+    _eventsOf = reference.Identity();
+    _events = VORIModelEvents_var(reference);
+  }
+  if (!_events)
     return;
   auto notification =
       VORHandle<QELPertPositionNotify>::Adopt(new QELPertPositionNotify(node, x, y));
-  events->Dispatch(notification);
+  _events->Dispatch(notification);
 }
 
 void QELPFVNodeOrganiser::DisplayCyclicWarningDialog() {

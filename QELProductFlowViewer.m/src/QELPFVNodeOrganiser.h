@@ -6,7 +6,9 @@
 // destruction.
 #pragma once
 
+#include "QELIPertNode.h"
 #include "QELPertController.h"
+#include "VORIModelEvents.h"
 #include "VORCommand.h"
 #include <vector>
 
@@ -48,7 +50,10 @@ class QELPFVNodeOrganiser : public VORCommand {
   void GetViewerOrSuperNodeSize(float* width, float* height);
   void DispatchNotif(VORBaseUnknown_var node);
   void DisplayCyclicWarningDialog();
-  void SetNodePosition(VORBaseUnknown_var& node, double x, double y);
+  void SetNodePosition(VORBaseUnknown_var& node, const QELIPertNode_var& pertNode, double x,
+                       double y);
+  // DispatchNotif with the node's QELIPertNode already at hand.
+  void Announce(VORBaseUnknown_var& node, const QELIPertNode_var& pertNode);
 
   VORListValVORBaseUnknown_var* _childNodeList = nullptr;
   VORRawCollint* _levelList;
@@ -62,6 +67,9 @@ class QELPFVNodeOrganiser : public VORCommand {
   // steps; computed once per entry point.
   std::vector<std::vector<int>> _successors;
   std::vector<int> _order;
+  // The model events of the last reference object announced to.
+  VORBaseUnknown* _eventsOf = nullptr;
+  VORIModelEvents_var _events;
 };
 
 // For programs that load the module by name (VORModuleLoader::FindSymbol): lays out the

@@ -56,7 +56,7 @@ void BM_OrganiserComputation(benchmark::State& state) {
   std::vector<double> ys(succ.size());
   for (auto _ : state) {
     const QELPFVLayoutCore::Levels levels = QELPFVLayoutCore::ComputeLevels(succ);
-    const std::vector<int> order = QELPFVLayoutCore::ExchangeSortOrder(levels.level);
+    const std::vector<int> order = QELPFVLayoutCore::StableLevelOrder(levels.level);
     const auto lists = QELPFVLayoutCore::LevelLists(succ, levels.level, order);
     const float side = QELPFVLayoutCore::ChartSide(levels.level);
     const int highest = static_cast<int>(lists.size()) - 1;

@@ -220,4 +220,46 @@ TEST(LayoutCoreTest, AChainOfAHundredThousandDoesNotOverflowTheStack) {
   EXPECT_FLOAT_EQ(QELPFVLayoutCore::ChartSide(levels.level), 50.0f * (n - 1));
 }
 
+TEST(LayoutCoreTest, TheLevelListsDoNotDependOnTheExchangeSortBeyondTheLowestLevel) {
+  // The organiser sorts by level with a counting sort; the level lists must come out as the
+  // literal exchange sort's do, on line-like and arbitrary graphs alike.
+  std::mt19937 rng(77);
+  int differentOrders = 0;
+  for (int round = 0; round < 3000; ++round) {
+    const int n = 1 + static_cast<int>(rng() % 40);
+    Successors g = RandomGraph(rng, n, round % 3 == 0);
+    Literal literal(g);
+    literal.Levels();
+    const std::vector<int> exchange = literal.Sort();
+    const std::vector<int> stable = QELPFVLayoutCore::StableLevelOrder(literal.level);
+    differentOrders += exchange != stable;
+    ASSERT_EQ(QELPFVLayoutCore::LevelLists(g, literal.level, stable), literal.Lists(exchange))
+        << "round " << round;
+  }
+  EXPECT_GT(differentOrders, 500) << "the two sorts really disagree on higher levels";
+}
+
+TEST(LayoutCoreTest, ALineStoredLaneByLaneGetsTheSameLevelListsFromBothSorts) {
+  // Four lanes of 300 stations, stored lane after lane, exchanging parts every tenth station:
+  // the case where the exchange sort's own order takes a quadratic number of swaps.
+  const int lanes = 4;
+  const int length = 300;
+  Successors g(static_cast<size_t>(lanes * length));
+  for (int lane = 0; lane < lanes; ++lane) {
+    for (int step = 0; step + 1 < length; ++step) {
+      auto& s = g[static_cast<size_t>(lane * length + step)];
+      s.push_back(lane * length + step + 1);
+      if (step % 10 == 9)
+        s.push_back(((lane + 1) % lanes) * length + step + 1);
+    }
+  }
+  const auto levels = QELPFVLayoutCore::ComputeLevels(g);
+  ASSERT_FALSE(levels.cyclic);
+  const auto exchange = QELPFVLayoutCore::ExchangeSortOrder(levels.level);
+  const auto stable = QELPFVLayoutCore::StableLevelOrder(levels.level);
+  EXPECT_NE(exchange, stable);
+  EXPECT_EQ(QELPFVLayoutCore::LevelLists(g, levels.level, stable),
+            QELPFVLayoutCore::LevelLists(g, levels.level, exchange));
+}
+
 }  // namespace
