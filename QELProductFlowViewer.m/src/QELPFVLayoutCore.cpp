@@ -158,14 +158,17 @@ std::vector<std::vector<int>> LevelLists(const Successors& successors,
     return lists;
   const int highest = level[static_cast<size_t>(order.back())];
   lists.resize(static_cast<size_t>(highest) + 1);
-  for (int node : order)
-    lists[static_cast<size_t>(level[static_cast<size_t>(node)])].push_back(node);
+  // Only the first list keeps the sorted order: every later one is rebuilt below.
+  for (int node : order) {
+    if (level[static_cast<size_t>(node)] == 0)
+      lists[0].push_back(node);
+  }
 
   // Membership of the list being rebuilt is its content before the rebuild: all nodes of that
   // level. Stamps drop duplicates (first occurrence kept) without clearing a set per level.
   std::vector<size_t> stamp(level.size(), 0);
   for (size_t k = 0; k + 1 < lists.size(); ++k) {
-    std::vector<int> next;
+    std::vector<int>& next = lists[k + 1];
     for (int node : lists[k]) {
       for (int s : successors[static_cast<size_t>(node)]) {
         if (level[static_cast<size_t>(s)] == static_cast<int>(k) + 1 &&
@@ -175,7 +178,6 @@ std::vector<std::vector<int>> LevelLists(const Successors& successors,
         }
       }
     }
-    lists[k + 1].swap(next);
   }
   return lists;
 }
