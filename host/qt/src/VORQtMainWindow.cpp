@@ -27,6 +27,7 @@
 #include "VORCommandHeader.h"
 #include "VOREnv.h"
 #include "VORFrmWindowKinds.h"
+#include "VORPixelImage.h"
 #include "VORQtApplication.h"
 #include "VORQtDialogs.h"
 #include "VORQtImageExport.h"
@@ -110,13 +111,16 @@ QIcon LetterIcon(const QString& title) {
 }
 
 QIcon CommandIcon(const VORWorkbenchCommand& command) {
-  if (!command.icon.empty()) {
-    const VORUnicodeString path = VORFindResource(VORUnicodeString(command.icon));
-    if (!path.IsEmpty()) {
-      QIcon icon(VORQtString(path));
-      if (!icon.isNull() && !icon.availableSizes().isEmpty())
-        return icon;
-    }
+  // The configured name as it stands, else with the usual image extensions.
+  for (const char* extension : {"", ".png", ".svg", ".bmp"}) {
+    if (command.icon.empty())
+      break;
+    VORUnicodeString path;
+    if (FAILED(VORGetImagePathName(VORUnicodeString(command.icon + extension), path)))
+      continue;
+    QIcon icon(VORQtString(path));
+    if (!icon.isNull() && !icon.availableSizes().isEmpty())
+      return icon;
   }
   return LetterIcon(VORQtString(command.title.empty() ? command.id : command.title));
 }
