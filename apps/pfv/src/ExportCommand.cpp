@@ -1,5 +1,6 @@
-// pfv export <document> --activity <name or id> [--out chart.svg|chart.png]: writes the PERT chart
-// of the activity's children as SVG (to standard output without --out).
+// pfv export <document> [--activity <name or id>] [--organise] [--out chart.svg|chart.png]: writes
+// the PERT chart of the activity's children (default: the root process) as SVG (to standard output
+// without --out); --organise lays it out with the Product Flow Viewer's organiser first.
 #include <cstdio>
 #include <filesystem>
 #include <string>
@@ -10,6 +11,7 @@
 #include "QELPertViewer.h"
 #include "VORDeferredDeletion.h"
 #include "VORModel.h"
+#include "VORModuleLoader.h"
 #include "VORSVGWriter.h"
 
 namespace {
@@ -45,6 +47,7 @@ int RunExport(const std::vector<std::string>& args) {
   std::string document;
   std::string activity;
   std::string out;
+  bool organise = false;
   bool usage = false;
   for (size_t i = 0; i < args.size(); ++i) {
     const std::string& a = args[i];
@@ -52,16 +55,18 @@ int RunExport(const std::vector<std::string>& args) {
       activity = args[++i];
     } else if (a == "--out" && i + 1 < args.size()) {
       out = args[++i];
+    } else if (a == "--organise") {
+      organise = true;
     } else if (!a.empty() && a[0] != '-' && document.empty()) {
       document = a;
     } else {
       usage = true;
     }
   }
-  if (usage || document.empty() || activity.empty()) {
-    std::fprintf(
-        stderr,
-        "Usage: pfv export <document.pprx> --activity <name or id> [--out chart.svg|chart.png]\n");
+  if (usage || document.empty()) {
+    std::fprintf(stderr,
+                 "Usage: pfv export <document.pprx> [--activity <name or id>] [--organise] "
+                 "[--out chart.svg|chart.png]\n");
     return 2;
   }
   std::string error;
@@ -70,7 +75,8 @@ int RunExport(const std::vector<std::string>& args) {
     std::fprintf(stderr, "pfv export: %s\n", error.c_str());
     return 1;
   }
-  VORBaseUnknown_var root = FindActivity(doc, activity);
+  // Without --activity: the root process, the level the Product Flow Viewer opens on first.
+  VORBaseUnknown_var root = activity.empty() ? doc->GetRootProcess() : FindActivity(doc, activity);
   if (!root) {
     std::fprintf(stderr, "pfv export: %s: no activity with the id or label \"%s\"\n",
                  document.c_str(), activity.c_str());
@@ -85,6 +91,20 @@ int RunExport(const std::vector<std::string>& args) {
     if (!controller) {
       std::fprintf(stderr, "pfv export: \"%s\" cannot be shown as a chart\n", activity.c_str());
       return 1;
+    }
+    // --organise: the default node positions of the Product Flow Viewer, by the organiser of the
+    // viewer module (loaded by name; positions change in memory only).
+    if (organise) {
+      using ArrangeChart = int (*)(VORBaseUnknown*, QELPertController*);
+      auto arrange = reinterpret_cast<ArrangeChart>(
+          VORModuleLoader::FindSymbol("QELProductFlowViewer", "QELPFVArrangeChart"));
+      if (arrange == nullptr) {
+        std::fprintf(stderr, "pfv export: --organise needs the viewer module: %s\n",
+                     VORModuleLoader::LastError().c_str());
+        return 1;
+      }
+      if (arrange(root, controller) == 1)
+        std::fprintf(stderr, "pfv export: the flows are cyclic; the stored positions are kept\n");
     }
     // Other formats than SVG come from the writers the build registers (PNG with the window).
     const PfvImageWriter* writer = out.empty() ? nullptr : PfvFindImageWriter(out);
@@ -115,5 +135,6 @@ int RunExport(const std::vector<std::string>& args) {
 
 }  // namespace
 
-PFV_COMMAND(export, "export", "<document.pprx> --activity <name or id> [--out chart.svg|chart.png]",
+PFV_COMMAND(export, "export",
+            "<document.pprx> [--activity <name or id>] [--organise] [--out chart.svg|chart.png]",
             "write the PERT chart of an activity's children as SVG (or PNG)", RunExport);
