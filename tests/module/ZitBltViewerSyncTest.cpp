@@ -12,8 +12,11 @@
 #include "VORDocument.h"
 #include "VORDriver.h"
 #include "VORFrmLayout.h"
+#include "VORISPPItemMgt.h"
 #include "VORModelDoor.h"
+#include "VORModuleLoader.h"
 #include "VORScript.h"
+#include "ZitBltTestSupport.h"
 
 namespace {
 
@@ -162,6 +165,64 @@ TEST_F(ZitBltViewerSyncTest, ScriptPrintsEveryZitBltOfANode) {
            << x << ", " << y << "), status 1, closed\n> zitblts Line\nno ZitBlts\n";
   EXPECT_EQ(out.str(), expected.str());
   EXPECT_FALSE(script.Run("zitblts Nowhere\n"));
+}
+
+// Product and assembly changes refresh the list ZitBlts of the activities they concern: a
+// configuration whose station lists are filled by the recording test command.
+class ZitBltViewerRefreshTest : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    startup.WriteConfig(
+        "<Config><ActivityZitBlt ActivityType=\"BIWActivityStation\">"
+        "<ZitBlt Name=\"ProductInput\" Type=\"QELZitBltRep\" LoadModule=\"QELZitBltVisu\">"
+        "<UpdateData CmdName=\"QELTestListZitBltCmd\" LoadModule=\"QELZitBltTestCmds\"/></ZitBlt>"
+        "<ZitBlt Name=\"ProductOutput\" Type=\"QELZitBltRep\" LoadModule=\"QELZitBltVisu\">"
+        "<UpdateData CmdName=\"QELTestListZitBltCmd\" LoadModule=\"QELZitBltTestCmds\"/></ZitBlt>"
+        "</ActivityZitBlt></Config>");
+    auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
+    VORModelDoor& door = doc->GetDoor();
+    VORBaseUnknown_var s, other, part, assembly;
+    door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", s, 0, "S");
+    door.SetLabel(s, VORUnicodeString("S"));
+    door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", other, 0, "T");
+    door.SetLabel(other, VORUnicodeString("T"));
+    door.CreateProduct(doc->GetRootProduct(), "Floor", part, "P1");
+    door.AssignItem(s, part);
+    door.CreateMfgAssembly("Floor assembly", assembly, "M1");
+    door.AssignItem(s, assembly);
+    std::string error;
+    const std::string file = dir.Path() + "/line.pprx";
+    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
+    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
+    ASSERT_TRUE(driver.PickObject("Line") && driver.StartCommand("QELFpaProductFlowViewerCmd"))
+        << driver.LastError();
+    log = reinterpret_cast<std::vector<std::string>* (*)()>(
+        VORModuleLoader::FindSymbol("QELZitBltTestCmds", "QELTestListZitBltLog"))();
+    log->clear();
+  }
+  VORBaseUnknown* Object(const char* id) const { return driver.GetDocument()->FindObject(id); }
+
+  ZitBltStartupDir startup;
+  TempDir dir;
+  VORDriver driver;
+  std::vector<std::string>* log = nullptr;
+};
+
+TEST_F(ZitBltViewerRefreshTest, AShowChangeOfAnAssignedPartRefreshesOnlyTheInputList) {
+  ASSERT_EQ(driver.GetDocument()->GetDoor().SetShown(Object("P1"), false), S_OK);
+  EXPECT_EQ(*log, std::vector<std::string>{"S/ProductInput/none"});
+}
+
+TEST_F(ZitBltViewerRefreshTest, DeletingAnAssemblyUnassignsItAndRefreshesEveryList) {
+  VORBaseUnknown_var s(Object("S"));
+  VORBaseUnknown_var assembly(Object("M1"));
+  ASSERT_EQ(driver.GetDocument()->GetDoor().DeleteMfgAssembly(assembly), S_OK);
+  // The unassignment reaches the station's commands first (an unassignment refreshes twice),
+  // then the viewer refreshes every ZitBlt of the station.
+  EXPECT_EQ(*log, (std::vector<std::string>{"S/ProductInput/none", "S/ProductInput/none",
+                                            "S/ProductOutput/none", "S/ProductOutput/none",
+                                            "S/ProductInput/none", "S/ProductOutput/none"}));
+  EXPECT_FALSE(VORISPPItemMgt_var(s)->IsItemAssigned(assembly));
 }
 
 }  // namespace
