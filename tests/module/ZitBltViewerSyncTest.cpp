@@ -225,4 +225,24 @@ TEST_F(ZitBltViewerRefreshTest, DeletingAnAssemblyUnassignsItAndRefreshesEveryLi
   EXPECT_FALSE(VORISPPItemMgt_var(s)->IsItemAssigned(assembly));
 }
 
+TEST_F(ZitBltViewerRefreshTest, ContextMenuOnASelectedPartOffersThePartsItems) {
+  const std::string viewer = driver.FindWindow("")->GetName().str();
+  ASSERT_TRUE(driver.PickObject("Floor")) << driver.LastError();
+  // Far from every node: nothing preselected, so the selected part counts.
+  ASSERT_TRUE(driver.OpenContextMenu(viewer, -500, -500)) << driver.LastError();
+  std::string menu = driver.DescribeMenu();
+  EXPECT_NE(menu.find("QELFpaPreviewWindowManagerCmd"), std::string::npos) << menu;
+  EXPECT_EQ(menu.find("CenterGraph"), std::string::npos) << menu;
+  // With a product space of the document open, its navigation items come too, and the product
+  // space becomes the current window.
+  ASSERT_TRUE(driver.StartCommand("ProductSpace")) << driver.LastError();
+  VORFrmWindow* space = VORFrmLayout::GetCurrentLayout()->GetCurrentWindow();
+  ASSERT_TRUE(driver.ActivateWindow(viewer)) << driver.LastError();
+  ASSERT_TRUE(driver.OpenContextMenu(viewer, -500, -500)) << driver.LastError();
+  menu = driver.DescribeMenu();
+  for (const char* item : {"CenterGraph", "ReframeOn", "HideShow", "QELFpaPreviewWindowManagerCmd"})
+    EXPECT_NE(menu.find(item), std::string::npos) << item << "\n" << menu;
+  EXPECT_EQ(VORFrmLayout::GetCurrentLayout()->GetCurrentWindow(), space);
+}
+
 }  // namespace
