@@ -153,6 +153,29 @@ TEST_F(ZitBltViewerSyncTest, ChildrenAddedOrRemovedInTheModelGainOrLoseTheirZitB
   EXPECT_EQ(driver.GetEditor()->GetISO()->GetElements().Size(), 2 * 3);
 }
 
+TEST_F(ZitBltViewerSyncTest, AClickOnTheButtonOpensAndClosesItAndADragSlidesItAlongItsEdge) {
+  QELZitBltRep* bar = StatusBar("A");
+  ASSERT_NE(bar, nullptr);
+  double x = 0, y = 0;
+  bar->GetPoDPosition(x, y);
+  // The status bar's icon stands above the top edge: click its middle.
+  ASSERT_TRUE(driver.PickInChart(Title(), x, y + 2)) << driver.LastError();
+  EXPECT_FALSE(bar->IsButtonCollapse());
+  ASSERT_TRUE(driver.PickInChart(Title(), x, y + 2)) << driver.LastError();
+  EXPECT_TRUE(bar->IsButtonCollapse());
+  // A drag to the right along the top edge, then one far beyond the node's right end.
+  ASSERT_TRUE(driver.Drag(Title(), x, y + 2, x + 6, y + 5)) << driver.LastError();
+  double nx = 0, ny = 0;
+  bar->GetPoDPosition(nx, ny);
+  EXPECT_GT(nx, x);
+  EXPECT_EQ(ny, y);
+  double xmin = 0, ymin = 0, xmax = 0, ymax = 0;
+  bar->GetPositioningLimits(xmin, ymin, xmax, ymax);
+  ASSERT_TRUE(driver.Drag(Title(), nx, y + 2, nx + 500, y + 2)) << driver.LastError();
+  bar->GetPoDPosition(nx, ny);
+  EXPECT_LE(nx, xmax);
+}
+
 TEST_F(ZitBltViewerSyncTest, ScriptPrintsEveryZitBltOfANode) {
   driver.TakeEvents();
   std::ostringstream out;
