@@ -26,7 +26,8 @@ class VORQtViewerWidget : public QWidget {
   // Fits everything shown into the window.
   void FitAll();
   // Catches up with the viewer: repaints what changed (nothing when nothing did), cursor,
-  // balloons. Called after every forwarded event and when the viewer asks for a redraw.
+  // balloons. Called after every forwarded event, and once after the current step when the
+  // viewer asks for redraws.
   void Sync();
 
   // Grid every cellSize model units (0, the default: none).
@@ -106,4 +107,5 @@ class VORQtViewerWidget : public QWidget {
   float _background[3] = {-1.0f, -1.0f, -1.0f};
   std::vector<Snapshot> _snapshot;
   bool _synced = false;
+  bool _syncQueued = false;
 };

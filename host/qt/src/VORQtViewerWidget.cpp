@@ -88,7 +88,13 @@ VORQtViewerWidget::VORQtViewerWidget(VORViewer* viewer, QWidget* parent)
   _redrawCallback = publisher->AddCallback(
       VORViewer::kRedrawEvent,
       [this](VORBaseUnknown*, const std::string&, VORNotification*, void*, VORCallbackId) {
-        Sync();
+        // Commands may ask for many redraws in one step (one per node built): one Sync once
+        // the step is over.
+        if (_syncQueued)
+          return;
+        _syncQueued = true;
+        QMetaObject::invokeMethod(
+            this, [this]() { Sync(); }, Qt::QueuedConnection);
       },
       nullptr, this);
   _contextCallback = publisher->AddCallback(
@@ -179,6 +185,7 @@ bool VORQtViewerWidget::ChangedArea(const VORRenderList& list, QRectF& area) con
 }
 
 void VORQtViewerWidget::Sync() {
+  _syncQueued = false;
   if (!_viewer)
     return;
   const VORQtViewTransform view = VORQtViewTransform::FromViewer(*_viewer);
