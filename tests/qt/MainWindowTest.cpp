@@ -16,6 +16,7 @@
 #include "QELPertController.h"
 #include "QELPertViewer.h"
 #include "QtTestHelpers.h"
+#include "TempDir.h"
 #include "VOR2DBagRep.h"
 #include "VOR2DManipulator.h"
 #include "VOR2DPolygonRep.h"
@@ -378,4 +379,30 @@ TEST_F(MainWindowTest, TheProductFlowViewerOpensFromTheMenuOnATreePickAndItsNode
   VORIGraphNodeLayout_var(node)->GetPertPosition(x1, y1);
   EXPECT_NEAR(x1, x0, 1e-6);
   EXPECT_LT(y1, y0 - 25.0) << "dragged down by about two grid cells";
+}
+
+TEST_F(MainWindowTest, SavingAsKeepsTheFileAndAFailureSaysWhy) {
+  VORQtViewerWidget* widget = OpenChart(2);
+  ASSERT_NE(widget, nullptr);
+  const QPoint from = NodePixel(widget, 0);
+  QTest::mousePress(widget, Qt::LeftButton, Qt::NoModifier, from);
+  QTest::mouseMove(widget, from + QPoint(20, 0));
+  QTest::mouseMove(widget, from + QPoint(40, 0));
+  QTest::mouseRelease(widget, Qt::LeftButton, Qt::NoModifier, from + QPoint(40, 0));
+  ASSERT_TRUE(window->isWindowModified());
+
+  TempDir dir;
+  const QString copy = QString::fromStdString(dir.Path() + "/copy.pprx");
+  ASSERT_TRUE(window->SaveDocumentAs(copy));
+  EXPECT_TRUE(QFileInfo::exists(copy));
+  EXPECT_FALSE(window->isWindowModified());
+  EXPECT_EQ(window->RecentFiles().front(), copy);
+  EXPECT_TRUE(window->windowTitle().startsWith("copy.pprx"));
+
+  MessageBoxAnswerer seen;
+  EXPECT_FALSE(window->SaveDocumentAs("/nonexistent-dir/x.pprx"));
+  ASSERT_TRUE(seen.seen);
+  EXPECT_EQ(seen.icon, QMessageBox::Critical);
+  EXPECT_TRUE(seen.text.contains("/nonexistent-dir/x.pprx"));
+  EXPECT_EQ(window->RecentFiles().front(), copy) << "a failed save changes nothing";
 }
