@@ -37,7 +37,8 @@ class QELFpaProductFlowViewer : public VORFrmWindow {
 
   // A new list (the caller deletes it) of the children of parent that are graph nodes.
   VORListValVORBaseUnknown_var* GetProductFlowViewerNodes(VORBaseUnknown_var& parent);
-  // Appends the nodes waiting to be placed to *ioList (nothing when either list is null).
+  // Appends the nodes waiting to be placed to *ioList (nothing when either list is null): the
+  // nodes that had never been placed in a chart when the window opened.
   void NodesForReArrangement(VORListValVORBaseUnknown_var*& ioList);
 
   void DeleteWindow() override;
