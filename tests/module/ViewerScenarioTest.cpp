@@ -540,6 +540,52 @@ TEST_F(ViewerTest, OrganiseDoesNothingWithoutAViewerAsCurrentWindow) {
 
 // --- The same story as a script ---------------------------------------------------------------
 
+namespace {
+std::string RunProgram(const std::string& command, int& status) {
+  std::string output;
+  FILE* pipe = ::popen(command.c_str(), "r");
+  if (pipe == nullptr) {
+    status = -1;
+    return output;
+  }
+  char buffer[4096];
+  for (size_t n; (n = std::fread(buffer, 1, sizeof buffer, pipe)) > 0;)
+    output.append(buffer, n);
+  status = ::pclose(pipe);
+  return output;
+}
+}  // namespace
+
+TEST_F(ViewerTest, ExportLaysTheRootLevelOutWithTheOrganiserOnRequest) {
+  auto a = Node(root, "A");
+  auto b = Node(root, "B");
+  Flow(a, b);
+  doc->GetDoor().SetPertPosition(a, true, 512.5, 512.5);
+  doc->GetDoor().SetPertPosition(b, true, 12.5, 12.5);
+  std::string error;
+  const std::string file = dir.Path() + "/export.pprx";
+  ASSERT_TRUE(doc->SaveAs(file, error)) << error;
+  int status = 0;
+  const std::string stored = RunProgram(PFV_BINARY " export " + file + " 2>/dev/null", status);
+  EXPECT_EQ(status, 0);
+  const std::string organised =
+      RunProgram(PFV_BINARY " export " + file + " --organise 2>/dev/null", status);
+  EXPECT_EQ(status, 0);
+  // The stored layout puts A far above and right of B; the organiser puts A left of B on one
+  // row, which shrinks the picture.
+  ASSERT_NE(stored.find("<svg"), std::string::npos) << stored;
+  ASSERT_NE(organised.find("<svg"), std::string::npos) << organised;
+  EXPECT_NE(stored, organised);
+  EXPECT_LT(organised.size(), stored.size());
+  // A cycle keeps the stored positions and says so.
+  doc->GetDoor().AddFlow(b, a);
+  ASSERT_TRUE(doc->SaveAs(file, error)) << error;
+  const std::string cyclic = RunProgram(
+      PFV_BINARY " export " + file + " --organise --out " + dir.Path() + "/c.svg 2>&1", status);
+  EXPECT_EQ(status, 0);
+  EXPECT_NE(cyclic.find("the flows are cyclic"), std::string::npos) << cyclic;
+}
+
 TEST(ViewerScriptTest, OpeningOrganisingAndSwitchingLevelsAsAScript) {
   TempDir dir;
   const std::string document = dir.Path() + "/line.pprx";
