@@ -7,6 +7,10 @@ if(PFV_WERROR)
   target_compile_options(pfv_warnings INTERFACE -Werror)
 endif()
 
+# Layers register their extensions from static initialisers: a linked layer must be loaded even
+# when no symbol of it is referenced directly (some toolchains default to --as-needed).
+add_link_options("LINKER:--no-as-needed")
+
 if(PFV_SANITIZE)
   add_compile_options(-fsanitize=address,undefined -fno-omit-frame-pointer -fno-sanitize-recover=undefined)
   add_link_options(-fsanitize=address,undefined)
