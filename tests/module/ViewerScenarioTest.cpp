@@ -5,6 +5,7 @@
 
 #include <cmath>
 #include <cstdlib>
+#include <random>
 #include <string>
 #include <vector>
 
@@ -27,6 +28,7 @@
 #include "VORFrmWindowKinds.h"
 #include "VORIGraphNodeLayout.h"
 #include "VORIModelEvents.h"
+#include "VORISPPFlowMgt.h"
 #include "VORModelDoor.h"
 #include "VORTrace.h"
 
@@ -604,4 +606,67 @@ TEST(ViewerScriptTest, OpeningOrganisingAndSwitchingLevelsAsAScript) {
   ASSERT_TRUE(VORReadFile(VIEWER_DATA "/viewer_story.expected", expected, error)) << error;
   EXPECT_EQ(output, expected);
   EXPECT_EQ(status, 0);
+}
+
+// --- Invariants over generated levels ---------------------------------------------------------
+
+TEST_F(ViewerTest, OnGeneratedLevelsFlowsGoRightAndNoTwoNodesShareAPlace) {
+  std::mt19937 rng(11);
+  int laidOut = 0;
+  int refused = 0;
+  for (int round = 0; round < 60; ++round) {
+    doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
+    root = doc->GetRootProcess();
+    const int n = 2 + static_cast<int>(rng() % 20);
+    std::vector<VORBaseUnknown_var> nodes;
+    for (int i = 0; i < n; ++i)
+      nodes.push_back(Node(root, ("N" + std::to_string(i)).c_str()));
+    // Forward flows in a hidden order, children stored shuffled.
+    std::vector<int> rank(static_cast<size_t>(n));
+    for (int i = 0; i < n; ++i)
+      rank[static_cast<size_t>(i)] = i;
+    std::shuffle(rank.begin(), rank.end(), rng);
+    for (int i = 0; i < n; ++i)
+      for (int j = 0; j < n; ++j)
+        if (rank[static_cast<size_t>(i)] < rank[static_cast<size_t>(j)] && rng() % 4 == 0)
+          Flow(nodes[static_cast<size_t>(i)], nodes[static_cast<size_t>(j)]);
+    VORFrmEditor* editor = VORApplicationFrame::GetApplicationFrame()->OpenDocument(doc);
+    ASSERT_NE(editor, nullptr);
+    auto* window = new QELFpaProductFlowViewer("Generated", editor, root);
+    auto* organiser = new QELPFVNodeOrganiser();
+    ASSERT_TRUE(organiser->ArrangeNodes(root, window->GetPertController()));
+    const bool cyclic = organiser->IsCyclic();
+    organiser->RequestDelayedDestruction();
+    std::vector<Point> placed;
+    for (int i = 0; i < n; ++i) {
+      VORIGraphNodeLayout_var layout(nodes[static_cast<size_t>(i)]);
+      if (cyclic) {
+        EXPECT_FALSE(layout->HasPertPosition()) << "round " << round;
+        continue;
+      }
+      if (!layout->HasPertPosition())
+        continue;
+      Point p{0, 0};
+      layout->GetPertPosition(p.x, p.y);
+      for (const Point& q : placed)
+        EXPECT_FALSE(p == q) << "round " << round << ": two nodes at (" << p.x << ", " << p.y
+                             << ")";
+      placed.push_back(p);
+      VORListValVORBaseUnknown_var* next = nullptr;
+      VORISPPFlowMgt_var(nodes[static_cast<size_t>(i)])->GetNextActivities(next);
+      for (const VORBaseUnknown_var& s : *next) {
+        VORIGraphNodeLayout_var target(s);
+        if (!target->HasPertPosition())
+          continue;
+        double x = 0, y = 0;
+        target->GetPertPosition(x, y);
+        EXPECT_LT(p.x, x) << "round " << round << ": a flow going left";
+      }
+      delete next;
+    }
+    (cyclic ? refused : laidOut)++;
+    VORApplicationFrame::GetApplicationFrame()->CloseAll();
+  }
+  EXPECT_GT(laidOut, 10);
+  EXPECT_GT(refused, 5);
 }
