@@ -32,7 +32,7 @@
 #include "VORPathElementAgent.h"
 #include "VORQtApplication.h"
 #include "VORQtMainWindow.h"
-#include "VORQtSpecTree.h"
+#include "VORQtDocumentTree.h"
 #include "VORQtStrings.h"
 #include "VORQtViewerWidget.h"
 #include "VORStateCommand.h"

@@ -1,4 +1,4 @@
-// The document's specification tree (process tree, products, resources) in a dock. Its
+// The document's document tree (process tree, products, resources) in a dock. Its
 // selection shows the editor's CSO and highlight; clicking an object picks it through the
 // driver, so it feeds the running command exactly as a pick in a chart does.
 #pragma once
@@ -11,13 +11,13 @@
 class VORDriver;
 class VORProcess;
 
-class VORQtSpecTree : public QTreeWidget {
+class VORQtDocumentTree : public QTreeWidget {
   Q_OBJECT
  public:
   // The role of an item's document id (a QString); empty for the three section headers.
   static constexpr int IdRole = Qt::UserRole + 1;
 
-  VORQtSpecTree(VORDriver& driver, QWidget* parent = nullptr);
+  VORQtDocumentTree(VORDriver& driver, QWidget* parent = nullptr);
 
   // Rebuilds the tree from document (null: empty), keeping the expanded branches.
   void Rebuild(VORProcess* document);

@@ -1,6 +1,6 @@
 // The application window: menus (File, Product Flow, View, Window), the Product Flow toolbar
 // filled from the workbench registry, a status bar with the running command's prompt and the
-// last message, the specification tree in a dock, and an MDI area holding the frame layout's
+// last message, the document tree in a dock, and an MDI area holding the frame layout's
 // windows. Every action goes through the headless driver or the dialog and viewer objects;
 // after each step the window catches up with the layout, the selection and the dialogs.
 #pragma once
@@ -21,7 +21,7 @@ class QMdiSubWindow;
 class QMenu;
 class QToolBar;
 class VORQtDialogManager;
-class VORQtSpecTree;
+class VORQtDocumentTree;
 class VORQtViewerWidget;
 
 class VORQtMainWindow : public QMainWindow {
@@ -52,7 +52,7 @@ class VORQtMainWindow : public QMainWindow {
   void AfterStep();
 
   QMdiArea* MdiArea() const { return _mdi; }
-  VORQtSpecTree* Tree() const { return _tree; }
+  VORQtDocumentTree* Tree() const { return _tree; }
   VORQtDialogManager* Dialogs() const { return _dialogs; }
   // The viewer widget of the active MDI window, or null.
   VORQtViewerWidget* CurrentViewerWidget() const;
@@ -84,7 +84,7 @@ class VORQtMainWindow : public QMainWindow {
 
   std::unique_ptr<VORDriver> _driver;
   QMdiArea* _mdi = nullptr;
-  VORQtSpecTree* _tree = nullptr;
+  VORQtDocumentTree* _tree = nullptr;
   VORQtDialogManager* _dialogs = nullptr;
   QMenu* _flowMenu = nullptr;
   QMenu* _recentMenu = nullptr;

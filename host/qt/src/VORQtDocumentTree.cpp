@@ -1,4 +1,4 @@
-#include "VORQtSpecTree.h"
+#include "VORQtDocumentTree.h"
 
 #include <QSet>
 #include <memory>
@@ -32,9 +32,9 @@ QSet<QString> LeafIds(VORSelectionSet* set) {
 }
 }  // namespace
 
-VORQtSpecTree::VORQtSpecTree(VORDriver& driver, QWidget* parent)
+VORQtDocumentTree::VORQtDocumentTree(VORDriver& driver, QWidget* parent)
     : QTreeWidget(parent), _driver(driver) {
-  setObjectName(QStringLiteral("SpecificationTree"));
+  setObjectName(QStringLiteral("DocumentTree"));
   setHeaderHidden(true);
   setSelectionMode(QAbstractItemView::ExtendedSelection);
   connect(this, &QTreeWidget::itemClicked, this,
@@ -43,7 +43,7 @@ VORQtSpecTree::VORQtSpecTree(VORDriver& driver, QWidget* parent)
           [this](QTreeWidgetItem* item, int) { OnClicked(item); });
 }
 
-void VORQtSpecTree::AddNode(QTreeWidgetItem* parent, VORBaseUnknown* node, int depth) {
+void VORQtDocumentTree::AddNode(QTreeWidgetItem* parent, VORBaseUnknown* node, int depth) {
   auto* item = new QTreeWidgetItem(parent, QStringList(VORQtString(VORFrmObjectLabel(node))));
   item->setData(0, IdRole, IdOf(node));
   VORIGENode_var gen{VORBaseUnknown_var(node)};
@@ -55,7 +55,7 @@ void VORQtSpecTree::AddNode(QTreeWidgetItem* parent, VORBaseUnknown* node, int d
     AddNode(item, child, depth + 1);
 }
 
-void VORQtSpecTree::AddProduct(QTreeWidgetItem* parent, VORBaseUnknown* product, int depth) {
+void VORQtDocumentTree::AddProduct(QTreeWidgetItem* parent, VORBaseUnknown* product, int depth) {
   auto* item = new QTreeWidgetItem(parent, QStringList(VORQtString(VORFrmObjectLabel(product))));
   item->setData(0, IdRole, IdOf(product));
   VORIProduct_var p{VORBaseUnknown_var(product)};
@@ -68,7 +68,7 @@ void VORQtSpecTree::AddProduct(QTreeWidgetItem* parent, VORBaseUnknown* product,
     AddProduct(item, child, depth + 1);
 }
 
-void VORQtSpecTree::Rebuild(VORProcess* document) {
+void VORQtDocumentTree::Rebuild(VORProcess* document) {
   QSet<QString> expanded;
   for (QTreeWidgetItemIterator it(this); *it; ++it) {
     if ((*it)->isExpanded())
@@ -104,17 +104,17 @@ void VORQtSpecTree::Rebuild(VORProcess* document) {
   ShowSelection();
 }
 
-QTreeWidgetItem* VORQtSpecTree::ItemOf(const QString& id) const {
+QTreeWidgetItem* VORQtDocumentTree::ItemOf(const QString& id) const {
   if (id.isEmpty())
     return nullptr;
-  for (QTreeWidgetItemIterator it(const_cast<VORQtSpecTree*>(this)); *it; ++it) {
+  for (QTreeWidgetItemIterator it(const_cast<VORQtDocumentTree*>(this)); *it; ++it) {
     if ((*it)->data(0, IdRole).toString() == id)
       return *it;
   }
   return nullptr;
 }
 
-void VORQtSpecTree::ShowSelection() {
+void VORQtDocumentTree::ShowSelection() {
   VORFrmEditor* editor = _driver.GetEditor();
   const QSet<QString> selected = LeafIds(editor ? editor->GetCSO() : nullptr);
   const QSet<QString> highlighted = LeafIds(editor ? editor->GetHSO() : nullptr);
@@ -134,7 +134,7 @@ void VORQtSpecTree::ShowSelection() {
   _updating = false;
 }
 
-void VORQtSpecTree::OnClicked(QTreeWidgetItem* item) {
+void VORQtDocumentTree::OnClicked(QTreeWidgetItem* item) {
   if (_updating || item == nullptr)
     return;
   const QString id = item->data(0, IdRole).toString();

@@ -31,7 +31,7 @@
 #include "VORQtApplication.h"
 #include "VORQtDialogs.h"
 #include "VORQtImageExport.h"
-#include "VORQtSpecTree.h"
+#include "VORQtDocumentTree.h"
 #include "VORQtStrings.h"
 #include "VORQtViewerWidget.h"
 #include "VORSVGWriter.h"
@@ -149,12 +149,12 @@ VORQtMainWindow::VORQtMainWindow(QWidget* parent)
     AfterStep();
   });
 
-  _tree = new VORQtSpecTree(*_driver, this);
-  auto* dock = new QDockWidget(tr("Specification Tree"), this);
-  dock->setObjectName(QStringLiteral("SpecificationTreeDock"));
+  _tree = new VORQtDocumentTree(*_driver, this);
+  auto* dock = new QDockWidget(tr("Document Tree"), this);
+  dock->setObjectName(QStringLiteral("DocumentTreeDock"));
   dock->setWidget(_tree);
   addDockWidget(Qt::LeftDockWidgetArea, dock);
-  connect(_tree, &VORQtSpecTree::picked, this, [this]() { AfterStep(); });
+  connect(_tree, &VORQtDocumentTree::picked, this, [this]() { AfterStep(); });
 
   _prompt = new QLabel(this);
   _prompt->setObjectName(QStringLiteral("Prompt"));
