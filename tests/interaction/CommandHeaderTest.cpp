@@ -77,6 +77,11 @@ TEST(WorkbenchTest, ReadsCommandsFromAFileAndRefusesAMalformedOneWhole) {
   ASSERT_EQ(VORWorkbench::Commands().size(), 2u);
   EXPECT_EQ(VORWorkbench::Find("Mod")->title, "Module command");
   EXPECT_EQ(VORWorkbench::Find("Other")->icon, "");
+  // Only commands whose module exports their factory count as installed.
+  EXPECT_TRUE(VORWorkbench::IsInstalled(*VORWorkbench::Find("Mod")));
+  EXPECT_FALSE(VORWorkbench::IsInstalled(*VORWorkbench::Find("Other")));
+  EXPECT_FALSE(VORWorkbench::IsInstalled(
+      VORWorkbenchCommand{"X", "", "", "InteractionTestModule", "NoSuchCommand"}));
 
   const std::string bad = dir.Write("bad.txt", "New | t | i | m | c\nBroken | only three | x\n");
   EXPECT_FALSE(VORWorkbench::LoadFile(bad, &error));

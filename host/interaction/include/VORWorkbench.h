@@ -25,6 +25,8 @@ const std::vector<VORWorkbenchCommand>& Commands();
 const VORWorkbenchCommand* Find(const std::string& id);
 // Reads a workbench file; false (and errorText) on a malformed line, nothing registered then.
 bool LoadFile(const std::string& path, std::string* errorText = nullptr);
+// True when the command's module loads and exports its factory (menus grey the others out).
+bool IsInstalled(const VORWorkbenchCommand& command);
 // A new header for the command with argument (caller's reference), or null for an unknown id.
 VORCommandHeader* CreateHeader(const std::string& id, VORBaseUnknown* argument = nullptr);
 // Forgets everything (tests).

@@ -4,6 +4,7 @@
 
 #include "VOREnv.h"
 #include "VORFileIO.h"
+#include "VORModuleLoader.h"
 
 namespace {
 struct Registry {
@@ -89,6 +90,13 @@ bool LoadFile(const std::string& path, std::string* errorText) {
   for (const VORWorkbenchCommand& c : read)
     Register(c);
   return true;
+}
+
+bool IsInstalled(const VORWorkbenchCommand& command) {
+  // Host classes have no module; module classes need their library and its factory.
+  if (command.module.empty())
+    return true;
+  return VORModuleLoader::FindSymbol(command.module, "fctCreate" + command.className) != nullptr;
 }
 
 VORCommandHeader* CreateHeader(const std::string& id, VORBaseUnknown* argument) {

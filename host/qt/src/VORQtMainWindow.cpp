@@ -297,6 +297,11 @@ void VORQtMainWindow::FillCommands() {
     action->setStatusTip(title);
     if (++n <= 9)
       action->setShortcut(QKeySequence(Qt::CTRL | Qt::SHIFT | static_cast<Qt::Key>(Qt::Key_0 + n)));
+    if (!VORWorkbench::IsInstalled(command)) {
+      // Listed but not installed in this build: shown, greyed, with the reason.
+      action->setEnabled(false);
+      action->setToolTip(title + tr(" (not installed: ") + VORQtString(command.module) + ")");
+    }
     connect(action, &QAction::triggered, this, [this, id]() { StartCommand(id); });
     _flowToolBar->addAction(action);
     _commandActions[id] = action;
