@@ -2,6 +2,7 @@
 // saves that never lose the previous file.
 #include "ModelTestSupport.h"
 
+#include <algorithm>
 #include <signal.h>
 #include <sys/resource.h>
 #include <sys/wait.h>
@@ -360,4 +361,30 @@ TEST(LoadErrorTest, DamagedFilesLoadConsistentlyOrFailNamingTheFile) {
     }
   }
   EXPECT_GT(failures, 200);
+}
+
+TEST(LoadProgressTest, ALoadReportsRisingPercentagesToAHundredAndAFailedOneStopsShort) {
+  VORModelGeneratorOptions o;
+  o.activities = 3000;
+  VORProcess_var doc = VORProcess_var::Adopt(VORModelGenerator::Generate(o));
+  const std::string text = doc->SaveToString();
+  std::vector<int> reports;
+  VORProcess::SetLoadProgress([&](int percent) { reports.push_back(percent); });
+  std::string error;
+  VORProcess_var loaded = LoadText(text, error);
+  ASSERT_TRUE(loaded) << error;
+  ASSERT_GE(reports.size(), 4u) << "the parse itself reports along the way";
+  EXPECT_EQ(reports.front(), 0);
+  EXPECT_EQ(reports.back(), 100);
+  EXPECT_TRUE(std::is_sorted(reports.begin(), reports.end()));
+
+  reports.clear();
+  EXPECT_FALSE(LoadText(text.substr(0, text.size() / 2), error));
+  ASSERT_FALSE(reports.empty());
+  EXPECT_LT(reports.back(), 100);
+
+  VORProcess::SetLoadProgress({});
+  reports.clear();
+  LoadText(text, error);
+  EXPECT_TRUE(reports.empty());
 }

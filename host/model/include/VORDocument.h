@@ -4,6 +4,8 @@
 // Every change goes through GetDoor() (the interfaces of the model objects call it).
 #pragma once
 
+#include <functional>
+
 #include <memory>
 #include <string>
 
@@ -73,6 +75,10 @@ class VORProcess : public VORDocument, public virtual VORIDocInit {
   // Loads a .pprx file. Null and a message naming the file and the line/column or the
   // offending id when the file is unreadable, ill-formed or inconsistent.
   static VORProcess* Load(const std::string& path, std::string& error);
+  // Observer of every following load (the window's progress dialog): called with 0..100 while a
+  // document loads; empty to stop. Loads run in the caller's thread, so the observer may pump
+  // the event loop (without user input) to repaint.
+  static void SetLoadProgress(std::function<void(int percent)> observer);
   // The same from text; name stands for the file in messages.
   static VORProcess* LoadFromString(const std::string& xml, const std::string& name,
                                     std::string& error);

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <cstddef>
+#include <functional>
 #include <memory>
 #include <stdexcept>
 #include <string>
@@ -29,6 +30,8 @@ struct ParseLimits {
   std::size_t maxFileBytes = std::size_t{64} << 20;
   std::size_t maxMemoryBytes = std::size_t{256} << 20;
   int maxDepth = 512;
+  // Called now and then during the parse with the share of the content read so far (0..1).
+  std::function<void(double)> progress;
 };
 
 // A parsed document, released with its parser.

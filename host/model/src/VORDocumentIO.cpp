@@ -619,12 +619,33 @@ class Writer {
 
 }  // namespace
 
+namespace {
+std::function<void(int)>& LoadProgress() {
+  static std::function<void(int)> observer;
+  return observer;
+}
+void Report(int percent) {
+  if (LoadProgress())
+    LoadProgress()(percent);
+}
+}  // namespace
+
+void VORProcess::SetLoadProgress(std::function<void(int percent)> observer) {
+  LoadProgress() = std::move(observer);
+}
+
 VORProcess* VORProcess::LoadFromString(const std::string& xml, const std::string& name,
                                        std::string& error) {
   VORModelLateTypes::Declare();
-  VORXercesPlatform::Document dom = VORXercesPlatform::ParseMemory(xml, name, error);
+  // Parsing is most of the time; building the objects and checking them share the rest.
+  VORXercesPlatform::ParseLimits limits;
+  if (LoadProgress())
+    limits.progress = [](double share) { Report(static_cast<int>(share * 60.0)); };
+  Report(0);
+  VORXercesPlatform::Document dom = VORXercesPlatform::ParseMemory(xml, name, error, limits);
   if (!dom)
     return nullptr;
+  Report(60);
   auto doc = VORHandle<VORProcess>::Adopt(new VORProcess());
   doc->_data->ids.reserve(xml.size() / 120);
   try {
@@ -634,6 +655,7 @@ VORProcess* VORProcess::LoadFromString(const std::string& xml, const std::string
     error = e.what();
     return nullptr;
   }
+  Report(90);
   std::vector<std::string> problems;
   if (!VORModelChecker::Check(doc.get(), problems)) {
     error = name + ": inconsistent document: " + problems.front();
@@ -642,6 +664,7 @@ VORProcess* VORProcess::LoadFromString(const std::string& xml, const std::string
   // Ids the loader did not use stay free for new objects.
   doc->_data->nextIdNumber = static_cast<long>(doc->_data->ids.size()) + 1;
   doc->_data->modified = false;
+  Report(100);
   return doc.Detach();
 }
 

@@ -108,8 +108,11 @@ class DepthFilter : public DOMLSParserFilter {
       tooDeep = true;
       return FILTER_INTERRUPT;
     }
-    if (parser != nullptr)
+    if (parser != nullptr) {
       offsets[element] = parser->getSrcOffset();
+      if (progress && total > 0 && ++_elements % 4096 == 0)
+        progress(static_cast<double>(parser->getSrcOffset()) / static_cast<double>(total));
+    }
     return FILTER_ACCEPT;
   }
   FilterAction acceptNode(DOMNode* node) override {
@@ -120,12 +123,15 @@ class DepthFilter : public DOMLSParserFilter {
   DOMNodeFilter::ShowType getWhatToShow() const override { return DOMNodeFilter::SHOW_ELEMENT; }
 
   DOMLSParserImpl* parser = nullptr;
+  std::function<void(double)> progress;
+  std::size_t total = 0;
   bool tooDeep = false;
   std::unordered_map<const DOMElement*, XMLFilePos> offsets;
 
  private:
   int _depth = 0;
   int _maxDepth;
+  long _elements = 0;
 };
 
 std::string Where(const std::string& name, long line, long column) {
@@ -232,6 +238,8 @@ Document ParseMemory(const std::string& content, const std::string& name, std::s
   impl->errors = std::make_unique<FirstErrorHandler>();
   impl->resolver = std::make_unique<NullResolver>();
   impl->filter = std::make_unique<DepthFilter>(limits.maxDepth);
+  impl->filter->progress = limits.progress;
+  impl->filter->total = content.size();
   impl->security = std::make_unique<SecurityManager>();
   impl->security->setEntityExpansionLimit(100);
   try {

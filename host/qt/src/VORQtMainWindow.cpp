@@ -38,6 +38,7 @@
 #include "VORSettingRepository.h"
 #include "VORStateCommand.h"
 #include "VORViewer.h"
+#include "VORDocument.h"
 #include "VORWorkbench.h"
 
 #if __has_include("QELPertChart.h")
@@ -340,19 +341,26 @@ QString VORQtMainWindow::PromptText() const {
 bool VORQtMainWindow::OpenDocument(const QString& path) {
   std::unique_ptr<QProgressDialog> progress;
   if (QFileInfo(path).size() >= kLargeDocument) {
-    // The load runs in one call: the dialog says what is happening while it lasts.
     progress = std::make_unique<QProgressDialog>(
-        tr("Loading %1...").arg(QFileInfo(path).fileName()), QString(), 0, 0, this);
+        tr("Loading %1...").arg(QFileInfo(path).fileName()), QString(), 0, 100, this);
     progress->setObjectName(QStringLiteral("LoadProgress"));
     progress->setWindowModality(Qt::WindowModal);
     progress->setMinimumDuration(0);
     progress->setValue(0);
     progress->show();
     QCoreApplication::processEvents(QEventLoop::ExcludeUserInputEvents);
+    // The load runs in this thread: each report repaints the dialog, user input waits.
+    VORProcess::SetLoadProgress([dialog = progress.get()](int percent) {
+      if (percent != dialog->value()) {
+        dialog->setValue(percent);
+        QCoreApplication::processEvents(QEventLoop::ExcludeUserInputEvents);
+      }
+    });
   }
   QApplication::setOverrideCursor(Qt::WaitCursor);
   const bool ok = _driver->OpenDocument(path.toStdString());
   QApplication::restoreOverrideCursor();
+  VORProcess::SetLoadProgress({});
   progress.reset();
   if (!ok) {
     const QString reason = VORQtString(_driver->LastError());
