@@ -67,6 +67,7 @@ TEST_F(PickTest, PicksThroughNestedTransformedBagsFrontToBackSkippingHiddenReps)
   EXPECT_EQ(IdOf(paths[1]->GetLeaf()), 2);
   std::unique_ptr<VORListValVORBaseUnknown_var> list(viewer->Pick(100.0, 50.0));
   EXPECT_EQ(list->Size(), 2);
+  EXPECT_EQ(viewer->PickPathsAtModelPoint(95.0, 17.0).size(), 2u);
 
   // Hiding the front node leaves the one behind; hiding a leaf inside a shown bag works too.
   bagB->SetShowMode(1);

@@ -266,6 +266,10 @@ std::vector<VORPathElement_var> VORViewer::PickPaths(double px, double py) {
   return PathsFromHits(PickReps(p.x, p.y, kPickTolerancePixels / _viewpoint->GetScale()));
 }
 
+std::vector<VORPathElement_var> VORViewer::PickPathsAtModelPoint(double x, double y) {
+  return PathsFromHits(PickReps(x, y, kPickTolerancePixels / _viewpoint->GetScale()));
+}
+
 VORListValVORBaseUnknown_var* VORViewer::Pick(double px, double py) {
   auto* list = new VORListValVORBaseUnknown_var();
   for (const VORPathElement_var& path : PickPaths(px, py))
