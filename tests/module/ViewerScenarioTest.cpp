@@ -3,6 +3,8 @@
 // nodes, and the default-node-positions command around super nodes.
 #include <gtest/gtest.h>
 
+#include "RunProgram.h"
+
 #include <cmath>
 #include <cstdlib>
 #include <random>
@@ -541,22 +543,6 @@ TEST_F(ViewerTest, OrganiseDoesNothingWithoutAViewerAsCurrentWindow) {
 }
 
 // --- The same story as a script ---------------------------------------------------------------
-
-namespace {
-std::string RunProgram(const std::string& command, int& status) {
-  std::string output;
-  FILE* pipe = ::popen(command.c_str(), "r");
-  if (pipe == nullptr) {
-    status = -1;
-    return output;
-  }
-  char buffer[4096];
-  for (size_t n; (n = std::fread(buffer, 1, sizeof buffer, pipe)) > 0;)
-    output.append(buffer, n);
-  status = ::pclose(pipe);
-  return output;
-}
-}  // namespace
 
 TEST_F(ViewerTest, ExportLaysTheRootLevelOutWithTheOrganiserOnRequest) {
   auto a = Node(root, "A");

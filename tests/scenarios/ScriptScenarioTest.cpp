@@ -1,6 +1,8 @@
 // The pick-copy story once more, as a script run by the pfv program.
 #include <gtest/gtest.h>
 
+#include "RunProgram.h"
+
 #include <cstdio>
 #include <cstdlib>
 #include <string>
@@ -10,19 +12,6 @@
 #include "VORFileIO.h"
 
 namespace {
-std::string RunProgram(const std::string& command, int& status) {
-  std::string output;
-  FILE* pipe = ::popen(command.c_str(), "r");
-  if (pipe == nullptr) {
-    status = -1;
-    return output;
-  }
-  char buffer[4096];
-  for (size_t n; (n = std::fread(buffer, 1, sizeof buffer, pipe)) > 0;)
-    output.append(buffer, n);
-  status = ::pclose(pipe);
-  return output;
-}
 
 void ReplaceAll(std::string& text, const std::string& from, const std::string& to) {
   for (size_t at = text.find(from); at != std::string::npos; at = text.find(from, at + to.size()))
