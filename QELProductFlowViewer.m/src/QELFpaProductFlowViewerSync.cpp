@@ -30,6 +30,7 @@
 #include "VORLateTypes.h"
 #include "VORSPPActivityNotification.h"
 #include "VORShowNotif.h"
+#include "VORWorkbench.h"
 
 namespace {
 
@@ -60,6 +61,21 @@ void AddHostItem(VORNotification* notification, const char* id) {
   if (VORDlgContextualMenu* menu = VORDlgContextualMenu::FromContext(context)) {
     auto* item = new VORDlgPushItem(menu, id);  // the menu holds its items
     item->SetCommandHeader(header);
+  }
+}
+
+// Adds a menu item that starts a workbench command (when its module is installed), titled as in
+// the menus.
+void AddWorkbenchItem(VORNotification* notification, const char* id) {
+  auto* context = dynamic_cast<VORContext*>(notification);
+  const VORWorkbenchCommand* command = VORWorkbench::Find(id);
+  if (context == nullptr || command == nullptr || !VORWorkbench::IsInstalled(*command))
+    return;
+  if (VORDlgContextualMenu* menu = VORDlgContextualMenu::FromContext(context)) {
+    auto header = VORCommandHeader_var::Adopt(VORWorkbench::CreateHeader(id));
+    auto* item = new VORDlgPushItem(menu, id);  // the menu holds its items
+    item->SetTitle(VORUnicodeString(command->title.c_str()));
+    item->SetCommandHeader(header.get());
   }
 }
 
@@ -406,6 +422,9 @@ void QELFpaProductFlowViewer::ContextMenuFor3DWindow(VORNotification* notificati
   AddHostItem(notification, "Properties");
   if (IsKindOf(object, "ASMPRODUCT"))
     AddPreviewWindowItem(notification);
+  // A selected activity with ZitBlts: hide and show them by name.
+  if (VORISPPActivity_var(selected) && QELIZitBltMgr_var(selected))
+    AddWorkbenchItem(notification, "QELFpaCtxZitBltCmd");
 }
 
 void QELFpaProductFlowViewer::ContextCB(VORCommand*, VORNotification* notification, void*) {

@@ -5,6 +5,8 @@
 
 #include "SampleLine.h"
 #include "TempDir.h"
+#include "VORDlgCheckButton.h"
+#include "VORDlgFrame.h"
 #include "VORDriver.h"
 #include "VORScript.h"
 
@@ -130,4 +132,35 @@ TEST_F(DriverTest, AScriptPrintsWindowsSelectionAndTheModelCheck) {
                            "[current]\n"
                            "> print check\n"
                            "model check: ok\n");
+}
+
+TEST_F(DriverTest, ToggleFindsACheckButtonByItsNameOrElseByItsTitle) {
+  VORDriver driver;
+  auto dialog = VORHandle<VORDlgDialog>::Adopt(new VORDlgDialog(nullptr, "Dlg", 0x40401));
+  auto* frame = new VORDlgFrame(dialog.get(), "Frame");
+  auto* untitled = new VORDlgCheckButton(frame, "");  // only a title, as a ZitBlt name has
+  untitled->SetTitle("Resource");
+  auto* named = new VORDlgCheckButton(frame, "Resource");  // a name wins over a title
+  named->SetTitle("Other");
+  (new VORDlgLabel(frame, "Label"))->SetTitle("Label");
+  dialog->SetVisibility(true);
+
+  ASSERT_TRUE(driver.ToggleCheckButton("Dlg", "Resource")) << driver.LastError();
+  EXPECT_TRUE(named->IsChecked());
+  EXPECT_FALSE(untitled->IsChecked());
+  auto* titled = new VORDlgCheckButton(frame, "");
+  titled->SetTitle("Front floor");
+  ASSERT_TRUE(driver.ToggleCheckButton("Dlg", "Front floor")) << driver.LastError();
+  EXPECT_TRUE(titled->IsChecked());
+
+  EXPECT_FALSE(driver.ToggleCheckButton("Dlg", "Label"));
+  EXPECT_EQ(driver.LastError(), "\"Label\" is not a check button");
+  EXPECT_FALSE(driver.ToggleCheckButton("Dlg", "Nothing"));
+  EXPECT_EQ(driver.LastError(), "no check button \"Nothing\" in \"Dlg\"");
+  untitled->SetSensitivity(false);
+  untitled->SetTitle("Gone grey");
+  EXPECT_FALSE(driver.ToggleCheckButton("Dlg", "Gone grey"));
+  EXPECT_EQ(driver.LastError(), "\"Gone grey\" is insensitive");
+  dialog->SetVisibility(false);
+  EXPECT_FALSE(driver.ToggleCheckButton("Dlg", "Front floor"));
 }

@@ -69,6 +69,14 @@ void DumpNode(VORBaseUnknown* node, std::ostringstream& out) {
     out << "  attribute " << Utf8(n) << " " << v.type << " " << v.longValue << " "
         << Num(v.doubleValue) << " '" << Utf8(v.stringValue) << "'\n";
   }
+  VORIZitBltVisibility_var zitBlts(node);
+  VORListValVORUnicodeString shownNames;
+  zitBlts->GetZitBltShownNames(shownNames);
+  for (const VORUnicodeString& n : shownNames) {
+    bool shown = false;
+    zitBlts->GetZitBltShown(n, shown);
+    out << "  zitblt " << Utf8(n) << " " << shown << "\n";
+  }
   VORIGENode_var(node)->GetChildren(list);
   for (const VORBaseUnknown_var& c : *list)
     DumpNode(c.get(), out);

@@ -5,6 +5,7 @@
 #include <vector>
 
 #include "QELIZitBltMgr.h"
+#include "VOREventPublisher.h"
 #include "VORExtension.h"
 
 class QELEZitBltMgr : public VORExtension, public QELIZitBltMgr {
@@ -34,6 +35,13 @@ class QELEZitBltMgr : public VORExtension, public QELIZitBltMgr {
   void BuildZitBlts();
   void Place(QELZitBltRep* rep, double x, double y, double w, double h);
   QELZitBltRep* Find(const VORUnicodeString& name) const;
+  void Announce();
+  // The visibility kept with the document: recorded on every change of a status, applied to
+  // the ZitBlts when they are built and again whenever the recorded one changes (undo, redo).
+  void RecordStatus(const VORUnicodeString& name, unsigned char status);
+  void ApplyRecordedStatuses(bool forgottenMeansShown);
+  void FollowRecordedStatuses();
+  void StopFollowingRecordedStatuses();
 
   bool _initialised = false;
   // ZitBlt name -> rep (the creator's reference), in configuration order.
@@ -43,4 +51,7 @@ class QELEZitBltMgr : public VORExtension, public QELIZitBltMgr {
   double _lastY = 0.0;
   double _lastWidth = 0.0;
   double _lastHeight = 0.0;
+  VORHandle<VOREventPublisher> _activityPublisher;  // while following the recorded statuses
+  VORCallbackId _recordedCallback = 0;
+  bool _recording = false;
 };

@@ -11,6 +11,7 @@
 #include "VORIModelEvents.h"
 #include "VORISPPActivity.h"
 #include "VORISpecObject.h"
+#include "VORIZitBltVisibility.h"
 #include "VORModify.h"
 
 namespace {
@@ -44,6 +45,7 @@ bool NodeGeometry(VORBaseUnknown* activity, double& x, double& y, double& w, dou
 }  // namespace
 
 QELEZitBltMgr::~QELEZitBltMgr() {
+  StopFollowingRecordedStatuses();
   for (auto& entry : _zitBlts)
     VORCommandDeletion(entry.second);
 }
@@ -98,6 +100,8 @@ void QELEZitBltMgr::BuildZitBlts() {
     if (subscriber && SUCCEEDED(subscriber->GetUpdateCommand(d.name, &command)) && command)
       command->Activate(rep, nullptr);
   }
+  ApplyRecordedStatuses(false);
+  FollowRecordedStatuses();
 }
 
 int QELEZitBltMgr::BuildZitBltReps(VORViewer* viewer) {
@@ -191,12 +195,25 @@ HRESULT QELEZitBltMgr::GetZitBltNames(VORListValVORUnicodeString*& names) {
 HRESULT QELEZitBltMgr::SetZitBltStatus(const VORUnicodeString& name, unsigned char status) {
   HRESULT result = S_OK;
   if (name == VORUnicodeString("All")) {
+    // "All" stands for every ZitBlt of the activity, so that the chart shows what the dialog's
+    // buttons say.
     _overallStatus = status;
+    RecordStatus(name, status);
+    for (auto& entry : _zitBlts) {
+      entry.second->SetStatus(status);
+      RecordStatus(entry.first, status);
+    }
   } else if (QELZitBltRep* rep = Find(name)) {
     rep->SetStatus(status);
+    RecordStatus(name, status);
   } else {
     result = E_FAIL;
   }
+  Announce();
+  return result;
+}
+
+void QELEZitBltMgr::Announce() {
   VORBaseUnknown* activity = GetExtendedObject();
   if (VORIModelEvents_var events{VORBaseUnknown_var(activity)}; events) {
     auto modify =
@@ -206,7 +223,61 @@ HRESULT QELEZitBltMgr::SetZitBltStatus(const VORUnicodeString& name, unsigned ch
         new QELPertAppInfoNotify(VORBaseUnknown_var(activity)));
     events->Dispatch(info);
   }
-  return result;
+}
+
+void QELEZitBltMgr::RecordStatus(const VORUnicodeString& name, unsigned char status) {
+  if (status > 1)
+    return;  // stored with no effect on the chart: nothing to keep
+  VORIZitBltVisibility_var recorded{VORBaseUnknown_var(GetExtendedObject())};
+  if (!recorded)
+    return;
+  _recording = true;
+  recorded->SetZitBltShown(name, status == 1);
+  _recording = false;
+}
+
+void QELEZitBltMgr::ApplyRecordedStatuses(bool forgottenMeansShown) {
+  VORIZitBltVisibility_var recorded{VORBaseUnknown_var(GetExtendedObject())};
+  if (!recorded)
+    return;
+  bool shown = true;
+  if (recorded->GetZitBltShown("All", shown) == S_OK)
+    _overallStatus = shown ? 1 : 0;
+  else if (forgottenMeansShown)
+    _overallStatus = 1;
+  for (auto& entry : _zitBlts) {
+    shown = true;
+    if (recorded->GetZitBltShown(entry.first, shown) != S_OK && !forgottenMeansShown)
+      continue;
+    const unsigned char status = shown ? 1 : 0;
+    if (entry.second->GetStatus() != status)
+      entry.second->SetStatus(status);
+  }
+}
+
+void QELEZitBltMgr::FollowRecordedStatuses() {
+  VORIModelEvents_var events{VORBaseUnknown_var(GetExtendedObject())};
+  if (!events || _recordedCallback != 0 || !VORIZitBltVisibility_var(events))
+    return;
+  // Only this activity's own changes arrive here: one callback per activity with ZitBlts.
+  _activityPublisher = events->GetEventPublisher();
+  _recordedCallback = _activityPublisher->AddCallback(
+      VORModify::ClassName(),
+      [this](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
+        auto* modify = dynamic_cast<VORModify*>(n);
+        if (_recording || modify == nullptr || modify->GetWhat() != "zitblt")
+          return;
+        ApplyRecordedStatuses(true);
+        Announce();
+      },
+      nullptr, this);
+}
+
+void QELEZitBltMgr::StopFollowingRecordedStatuses() {
+  if (_recordedCallback != 0 && _activityPublisher)
+    _activityPublisher->RemoveCallback(_recordedCallback);
+  _recordedCallback = 0;
+  _activityPublisher = NULL_var;
 }
 
 HRESULT QELEZitBltMgr::GetZitBltStatus(const VORUnicodeString& name, unsigned char& status) {
@@ -229,6 +300,7 @@ HRESULT QELEZitBltMgr::GetZitBlt(const VORUnicodeString& name, QELZitBltRep** re
 }
 
 HRESULT QELEZitBltMgr::RemoveZitBlts() {
+  StopFollowingRecordedStatuses();
   if (QELIZitBltCBSubscriber_var subscriber{VORBaseUnknown_var(GetExtendedObject())};
       subscriber && subscriber->IsSubscribed())
     subscriber->Unsubscribe();

@@ -315,11 +315,34 @@ bool VORDriver::ChooseComboLine(const std::string& dialog, const std::string& co
   return Step(true);
 }
 
+namespace {
+// The first check button at any depth below control whose title is title, or null.
+VORDlgCheckButton* CheckButtonTitled(const VORDlgControl* control, const std::string& title) {
+  for (VORDlgControl* child : control->GetControls()) {
+    auto* button = dynamic_cast<VORDlgCheckButton*>(child);
+    if (button != nullptr && button->GetTitle().ConvertToUTF8() == title)
+      return button;
+    if (VORDlgCheckButton* below = CheckButtonTitled(child, title))
+      return below;
+  }
+  return nullptr;
+}
+}  // namespace
+
 bool VORDriver::ToggleCheckButton(const std::string& dialog, const std::string& button) {
   _error.clear();
-  auto* b = dynamic_cast<VORDlgCheckButton*>(FindControl(dialog, button));
+  VORDlgDialog* d = FindDialog(dialog);
+  if (d == nullptr)
+    return Fail("no dialog \"" + dialog + "\" is shown");
+  // By name first; buttons that have only a title (one per ZitBlt name, say) by their title.
+  VORDlgControl* named = d->FindControl(button);
+  auto* b = dynamic_cast<VORDlgCheckButton*>(named);
   if (b == nullptr)
-    return _error.empty() ? Fail("\"" + button + "\" is not a check button") : false;
+    b = CheckButtonTitled(d, button);
+  if (b == nullptr)
+    return Fail(named != nullptr
+                    ? "\"" + button + "\" is not a check button"
+                    : "no check button \"" + button + "\" in \"" + d->GetName().str() + "\"");
   if (!b->UserToggle())
     return Fail("\"" + button + "\" is insensitive");
   return Step(true);

@@ -35,6 +35,7 @@
 #include "VORISpecObject.h"
 #include "VORIUserAttributes.h"
 #include "VORIVisProperties.h"
+#include "VORIZitBltVisibility.h"
 #include "VORModelChecker.h"
 #include "VORModelDoor.h"
 #include "VORModelTypes.h"

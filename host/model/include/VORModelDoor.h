@@ -6,6 +6,7 @@
 #pragma once
 
 #include <functional>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -62,6 +63,9 @@ class VORModelDoor {
   HRESULT SetPertNodeSize(VORBaseUnknown* node, double w, double h);
   HRESULT SetUserAttribute(VORBaseUnknown* activity, const VORUnicodeString& name,
                            const VORAttributeValue& value);
+  // The recorded visibility of an activity's ZitBlt (or "All"); nullopt forgets it.
+  HRESULT SetZitBltShown(VORBaseUnknown* activity, const VORUnicodeString& name,
+                         std::optional<bool> shown);
 
   // Product inputs / outputs.
   HRESULT AddProductIO(VORBaseUnknown* activity, VORBaseUnknown* item, bool input,

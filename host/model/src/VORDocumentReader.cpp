@@ -376,6 +376,17 @@ class Loader {
     return node;
   }
 
+  // <zitblt name="..." shown="0|1"/>: the visibility a planner chose for one ZitBlt.
+  void LoadZitBltShown(DOMElement* c, VORActivityImpl* a) {
+    const std::string name = Required(c, "name");
+    const long shown = Long(c, "shown", 1, a->id);
+    if (name.empty() || a->zitBltShown.count(name))
+      Fail(c, "'" + a->id + "': ZitBlt '" + name + "' empty or given twice");
+    if (shown != 0 && shown != 1)
+      Fail(c, "'" + a->id + "': ZitBlt '" + name + "' shown is not 0 or 1");
+    a->zitBltShown[name] = shown == 1;
+  }
+
   void LoadNodeBody(DOMElement* e, VORGraphNodeImpl* node) {
     const std::string& id = node->id;
     node->label = Text(e, "label");
@@ -438,6 +449,8 @@ class Loader {
         if (name.empty() || a->attributes.count(name))
           Fail(c, "'" + id + "': attribute '" + name + "' empty or given twice");
         a->attributes[name] = TypedValue(c, id);
+      } else if (IsTag(c, "zitblt")) {
+        LoadZitBltShown(c, a);
       } else if (IsTag(c, "flow")) {
         flows.push_back(c);
       } else {

@@ -110,6 +110,11 @@ class Writer {
       Set(c, "name", name);
       SetValue(c, value);
     }
+    for (auto& [name, shown] : a->zitBltShown) {
+      DOMElement* c = Element(e, "zitblt");
+      Set(c, "name", name);
+      Set(c, "shown", std::string(shown ? "1" : "0"));
+    }
     std::vector<std::pair<std::uint64_t, std::pair<VORGraphNodeImpl*, VORGraphNodeImpl*>>> flows;
     for (auto& c : a->children) {
       Node(e, c.get());

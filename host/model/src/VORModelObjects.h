@@ -162,7 +162,8 @@ class VORActivityImpl : public VORGraphNodeImpl,
                         public virtual VORISPPChildManagement,
                         public virtual VORISPPItemMgt,
                         public virtual VORISPPResourceManagement,
-                        public virtual VORIUserAttributes {
+                        public virtual VORIUserAttributes,
+                        public virtual VORIZitBltVisibility {
   VOR_DECLARE_CLASS(VORActivityImpl, VORGraphNodeImpl)
  public:
   static constexpr unsigned KindMask = VORKindActivity;
@@ -200,6 +201,11 @@ class VORActivityImpl : public VORGraphNodeImpl,
   HRESULT GetAttributeValue(const VORUnicodeString& name, VORAttributeValue& value) override;
   HRESULT SetAttributeValue(const VORUnicodeString& name, const VORAttributeValue& value) override;
   HRESULT GetAttributeNames(VORListValVORUnicodeString& names) override;
+  // VORIZitBltVisibility
+  HRESULT GetZitBltShown(const VORUnicodeString& name, bool& shown) override;
+  HRESULT SetZitBltShown(const VORUnicodeString& name, bool shown) override;
+  HRESULT ForgetZitBltShown(const VORUnicodeString& name) override;
+  HRESULT GetZitBltShownNames(VORListValVORUnicodeString& names) override;
 
   VORActivityImpl* AsActivity() override { return this; }
   VORActivityImpl* Root();
@@ -209,6 +215,7 @@ class VORActivityImpl : public VORGraphNodeImpl,
   double time = 0;
   double stationCycleTime = 0;  // stations only
   std::map<std::string, VORAttributeValue> attributes;
+  std::map<std::string, bool> zitBltShown;  // ZitBlt name (or "All") -> shown
 
  protected:
   ~VORActivityImpl() override;

@@ -109,6 +109,8 @@ struct Copier {
       door.SetStationCycleTime(created, a->stationCycleTime);
     for (auto& [name, value] : a->attributes)
       door.SetUserAttribute(created, VORUnicodeString(name), value);
+    for (auto& [name, shown] : a->zitBltShown)
+      door.SetZitBltShown(created, VORUnicodeString(name), shown);
     std::unordered_map<VORProductIOImpl*, VORBaseUnknown*> ios;
     std::vector<VORBaseUnknown_var> keep;
     for (auto& io : a->productIOs) {

@@ -1,0 +1,252 @@
+// Hiding and showing ZitBlts by name on the selected activities, through the headless driver:
+// the dialog's buttons, "All" and its deliberate asymmetry, several activities at once, the
+// warning without ZitBlts, one undoable change per click, and the visibility kept with the
+// document across a save and a new opening of the viewer (as a script run by the pfv program).
+#include <gtest/gtest.h>
+
+#include <cstdio>
+#include <cstdlib>
+
+#include "QELIZitBltMgr.h"
+#include "QELZitBltRep.h"
+#include "RunProgram.h"
+#include "VORDocument.h"
+#include "VORDriver.h"
+#include "VORFileIO.h"
+#include "VORIZitBltVisibility.h"
+#include "VORModelDoor.h"
+#include "ZitBltTestSupport.h"
+
+namespace {
+
+constexpr const char* kDialog = "QELFpaZitBltHideShowDlg";
+
+// Stations carry three ZitBlts, loadings one, groupings none.
+std::string Config() {
+  auto zitblt = [](const char* name, const char* location) {
+    return std::string("<ZitBlt Name=\"") + name +
+           "\" Type=\"QELZitBltRep\" LoadModule=\"QELZitBltVisu\" Location=\"" + location +
+           "\" IconFile=\"I_Test\"/>\n";
+  };
+  return "<Config><ActivityZitBlt ActivityType=\"BIWActivityStation\">\n" +
+         zitblt("Inputs", "lefttop") + zitblt("Outputs", "righttop") +
+         zitblt("Resources", "bottommiddle") +
+         "</ActivityZitBlt>\n<ActivityZitBlt ActivityType=\"BIWActivityLoading\">\n" +
+         zitblt("Status", "topmiddle") + "</ActivityZitBlt></Config>\n";
+}
+
+class ZitBltVisibilityCmdTest : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    startup.WriteIcon("I_Test", 16, 8);
+    startup.WriteConfig(Config());
+    auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
+    VORModelDoor& door = doc->GetDoor();
+    for (auto [label, type] : {std::pair{"S1", "BIWActivityStation"},
+                               {"S2", "BIWActivityStation"},
+                               {"L", "BIWActivityLoading"},
+                               {"G", "BIWActivityGrouping"}}) {
+      VORBaseUnknown_var node;
+      door.CreateNode(doc->GetRootProcess(), type, node);
+      door.SetLabel(node, VORUnicodeString(label));
+    }
+    std::string error;
+    file = startup.Path().string() + "/line.pprx";
+    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
+    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
+    ASSERT_TRUE(driver.PickObject("Line") && driver.StartCommand("QELFpaProductFlowViewerCmd"))
+        << driver.LastError();
+  }
+
+  // Selects the activities (the first one first) and starts the command.
+  bool StartOn(std::initializer_list<const char*> labels) {
+    bool first = true;
+    for (const char* label : labels) {
+      if (first && !driver.PickObject(label))
+        return false;
+      if (!first)
+        driver.GetEditor()->GetCSO()->AddElement(driver.PathOf(label));
+      first = false;
+    }
+    return driver.StartCommand("QELFpaCtxZitBltCmd");
+  }
+  std::string Dialog() const { return driver.DescribeDialog(kDialog); }
+  bool Toggle(const char* button) { return driver.ToggleCheckButton(kDialog, button); }
+  QELIZitBltMgr_var Manager(const char* label) const {
+    return QELIZitBltMgr_var(VORBaseUnknown_var(driver.FindObject(label)));
+  }
+  int Status(const char* label, const char* name) const {
+    unsigned char status = 9;
+    Manager(label)->GetZitBltStatus(name, status);
+    return status;
+  }
+  // Whether the ZitBlt shows on its node in the chart.
+  bool Shown(const char* label, const char* name) const {
+    QELZitBltRep* rep = nullptr;
+    Manager(label)->GetZitBlt(name, &rep);
+    return rep != nullptr && rep->GetZitBltBtn() != nullptr && rep->GetZitBltBtn()->IsShown();
+  }
+  std::string Button(const char* title, const char* value, int row) const {
+    return std::string("    CheckButton \"\" title=\"") + title + "\" value=\"" + value + "\" at " +
+           std::to_string(row) + ",0\n";
+  }
+
+  ZitBltStartupDir startup;
+  std::string file;
+  VORDriver driver;
+};
+
+TEST_F(ZitBltVisibilityCmdTest, OneNameHasNoAllButtonAndItsButtonSitsOnRowOne) {
+  ASSERT_TRUE(StartOn({"L"})) << driver.LastError();
+  EXPECT_EQ(Dialog(),
+            "Dialog \"QELFpaZitBltHideShowDlg\"\n"
+            "  Frame \"ZitBlts\" title=\"ZitBlts\" at 0,0\n" +
+                Button("Status", "checked", 1));
+  ASSERT_TRUE(Toggle("Status")) << driver.LastError();
+  EXPECT_EQ(Status("L", "Status"), 0);
+  EXPECT_FALSE(Shown("L", "Status")) << "applied at once, before OK";
+  EXPECT_FALSE(Toggle("All"));
+  ASSERT_TRUE(driver.PressOK(kDialog));
+  EXPECT_EQ(driver.GetRunningCommand(), nullptr);
+  EXPECT_EQ(VORDlgDialog::FindShown(kDialog), nullptr);
+}
+
+TEST_F(ZitBltVisibilityCmdTest, SeveralNamesUnderAllWhichSetsEveryOne) {
+  ASSERT_TRUE(StartOn({"S1"})) << driver.LastError();
+  EXPECT_EQ(Dialog(),
+            "Dialog \"QELFpaZitBltHideShowDlg\"\n"
+            "  Frame \"ZitBlts\" title=\"ZitBlts\" at 0,0\n"
+            "    CheckButton \"All\" title=\"All\" value=\"checked\" at 0,0\n" +
+                Button("Inputs", "checked", 1) + Button("Outputs", "checked", 2) +
+                Button("Resources", "checked", 3));
+  ASSERT_TRUE(Toggle("All")) << driver.LastError();
+  EXPECT_EQ(Dialog().find("value=\"checked\""), std::string::npos) << Dialog();
+  for (const char* name : {"All", "Inputs", "Outputs", "Resources"})
+    EXPECT_EQ(Status("S1", name), 0) << name;
+  EXPECT_FALSE(Shown("S1", "Inputs"));
+  EXPECT_FALSE(Shown("S1", "Resources"));
+  EXPECT_TRUE(Shown("S2", "Inputs")) << "S2 was not selected";
+  ASSERT_TRUE(Toggle("All"));
+  EXPECT_EQ(Dialog().find("value=\"unchecked\""), std::string::npos) << Dialog();
+  EXPECT_TRUE(Shown("S1", "Inputs"));
+  EXPECT_TRUE(Shown("S1", "Resources"));
+  ASSERT_TRUE(driver.CloseDialog(kDialog));
+  EXPECT_EQ(driver.GetRunningCommand(), nullptr);
+}
+
+TEST_F(ZitBltVisibilityCmdTest, AllFollowsTheNamesOnlyWhenEveryOneAgrees) {
+  ASSERT_TRUE(StartOn({"S1"})) << driver.LastError();
+  VORDlgDialog* dialog = VORDlgDialog::FindShown(kDialog);
+  auto all = [&] { return dialog->FindControl("All")->GetValueText().ConvertToUTF8(); };
+  // Unchecking one name while "All" is checked leaves "All" checked.
+  ASSERT_TRUE(Toggle("Outputs"));
+  EXPECT_EQ(all(), "checked");
+  EXPECT_FALSE(Shown("S1", "Outputs"));
+  EXPECT_TRUE(Shown("S1", "Inputs"));
+  // Unchecking the others too brings "All" into line.
+  ASSERT_TRUE(Toggle("Inputs"));
+  EXPECT_EQ(all(), "checked");
+  ASSERT_TRUE(Toggle("Resources"));
+  EXPECT_EQ(all(), "unchecked");
+  // Checking names back: "All" is checked only with the last one.
+  ASSERT_TRUE(Toggle("Inputs"));
+  ASSERT_TRUE(Toggle("Outputs"));
+  EXPECT_EQ(all(), "unchecked");
+  ASSERT_TRUE(Toggle("Resources"));
+  EXPECT_EQ(all(), "checked");
+  EXPECT_EQ(Status("S1", "All"), 1) << "the names alone never set the activity's All";
+  ASSERT_TRUE(driver.PressOK(kDialog));
+}
+
+TEST_F(ZitBltVisibilityCmdTest, SeveralActivitiesShowTheFirstOnesStatesAndAllTakeEachChange) {
+  Manager("S2")->SetZitBltStatus("Inputs", 0);
+  ASSERT_TRUE(StartOn({"S1", "S2", "L"})) << driver.LastError();
+  EXPECT_NE(Dialog().find(Button("Inputs", "checked", 1)), std::string::npos) << Dialog();
+  ASSERT_TRUE(Toggle("Outputs"));
+  for (const char* label : {"S1", "S2"}) {
+    EXPECT_FALSE(Shown(label, "Outputs")) << label;
+    EXPECT_EQ(Status(label, "Outputs"), 0) << label;
+  }
+  EXPECT_TRUE(Shown("S1", "Inputs"));
+  EXPECT_FALSE(Shown("S2", "Inputs")) << "only the name clicked changes";
+  EXPECT_TRUE(Shown("L", "Status")) << "an activity without that name is skipped";
+  ASSERT_TRUE(Toggle("All"));
+  EXPECT_EQ(Status("L", "Status"), 0) << "All reaches every ZitBlt of every activity";
+  ASSERT_TRUE(driver.PressOK(kDialog));
+}
+
+TEST_F(ZitBltVisibilityCmdTest, TheChartsContextMenuOffersTheCommandOnASelectedActivity) {
+  const std::string viewer = driver.FindWindow("")->GetName().str();
+  ASSERT_TRUE(driver.PickObject("S2"));
+  // Far from every node: nothing preselected, so the selected activity counts.
+  ASSERT_TRUE(driver.OpenContextMenu(viewer, -500, -500)) << driver.LastError();
+  EXPECT_NE(
+      driver.DescribeMenu().find("PushItem \"QELFpaCtxZitBltCmd\" title=\"Show/Hide ZitBlts\""),
+      std::string::npos)
+      << driver.DescribeMenu();
+  ASSERT_TRUE(driver.ChooseMenuItem("Show/Hide ZitBlts")) << driver.LastError();
+  ASSERT_TRUE(Toggle("Inputs")) << driver.LastError();
+  EXPECT_FALSE(Shown("S2", "Inputs"));
+  ASSERT_TRUE(driver.PressOK(kDialog));
+  ASSERT_TRUE(driver.PickObject("Line"));
+  // The root activity has no ZitBlts: no item, and here no menu at all.
+  EXPECT_FALSE(driver.OpenContextMenu(viewer, -500, -500)) << driver.DescribeMenu();
+}
+
+TEST_F(ZitBltVisibilityCmdTest, WithoutZitBltsOnTheFirstActivityAWarningEndsTheCommand) {
+  const size_t before = driver.Notifications().size();
+  ASSERT_TRUE(StartOn({"G", "S1"})) << driver.LastError();
+  ASSERT_EQ(driver.Notifications().size(), before + 1);
+  const VORDlgNotifyRecord& warning = driver.Notifications().back();
+  EXPECT_EQ(warning.id, "NoZitBlt");
+  EXPECT_EQ(warning.title, "Warning");
+  EXPECT_EQ(warning.text, "No ZitBlts Present");
+  EXPECT_EQ(warning.style, 0x10000200);
+  EXPECT_EQ(VORDlgDialog::FindShown(kDialog), nullptr);
+  EXPECT_EQ(driver.GetRunningCommand(), nullptr);
+  EXPECT_TRUE(Shown("S1", "Inputs"));
+}
+
+TEST_F(ZitBltVisibilityCmdTest, AClickIsOneUndoableChangeOfTheDocument) {
+  VORModelDoor& door = driver.GetDocument()->GetDoor();
+  ASSERT_TRUE(StartOn({"S1", "S2"})) << driver.LastError();
+  VORChangeLog log;
+  door.SetRecorder(&log);
+  ASSERT_TRUE(Toggle("All"));
+  door.SetRecorder(nullptr);
+  EXPECT_TRUE(driver.GetDocument()->IsModified());
+  bool shown = true;
+  EXPECT_EQ(VORIZitBltVisibility_var(VORBaseUnknown_var(driver.FindObject("S2")))
+                ->GetZitBltShown("Resources", shown),
+            S_OK);
+  EXPECT_FALSE(shown);
+  VORChangeLog redo;
+  door.Undo(log, &redo);
+  for (const char* label : {"S1", "S2"}) {
+    EXPECT_TRUE(Shown(label, "Outputs")) << label;
+    EXPECT_EQ(Status(label, "All"), 1) << label;
+  }
+  door.Undo(redo);
+  EXPECT_FALSE(Shown("S2", "Outputs"));
+  EXPECT_EQ(Status("S1", "All"), 0);
+  ASSERT_TRUE(driver.PressOK(kDialog));
+}
+
+TEST_F(ZitBltVisibilityCmdTest, TheChosenVisibilitySurvivesASaveAndANewOpening) {
+  ::setenv("SCENARIO_DOC", file.c_str(), 1);
+  const std::string saved = startup.Path().string() + "/saved.pprx";
+  ::setenv("SCENARIO_SAVED", saved.c_str(), 1);
+  int status = 0;
+  std::string output =
+      RunProgram(PFV_BINARY " script " VIEWER_DATA "/zitblt_visibility.pfvs 2>&1", status);
+  for (const std::string& path : {saved, file}) {
+    for (size_t at = output.find(path); at != std::string::npos; at = output.find(path))
+      output.replace(at, path.size(), path == saved ? "${SCENARIO_SAVED}" : "${SCENARIO_DOC}");
+  }
+  std::string expected, error;
+  ASSERT_TRUE(VORReadFile(VIEWER_DATA "/zitblt_visibility.expected", expected, error)) << error;
+  EXPECT_EQ(output, expected);
+  EXPECT_EQ(status, 0);
+}
+
+}  // namespace
