@@ -42,14 +42,17 @@ class ZitBltVisibilityCmdTest : public ::testing::Test {
     startup.WriteConfig(Config());
     auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
     VORModelDoor& door = doc->GetDoor();
+    VORBaseUnknown_var node;
     for (auto [label, type] : {std::pair{"S1", "BIWActivityStation"},
                                {"S2", "BIWActivityStation"},
                                {"L", "BIWActivityLoading"},
                                {"G", "BIWActivityGrouping"}}) {
-      VORBaseUnknown_var node;
       door.CreateNode(doc->GetRootProcess(), type, node);
       door.SetLabel(node, VORUnicodeString(label));
     }
+    VORBaseUnknown_var inner;  // inside the collapsed grouping: no ZitBlts built by the viewer
+    door.CreateNode(node, "BIWActivityStation", inner);
+    door.SetLabel(inner, VORUnicodeString("S3"));
     std::string error;
     file = startup.Path().string() + "/line.pprx";
     ASSERT_TRUE(doc->SaveAs(file, error)) << error;
@@ -160,7 +163,7 @@ TEST_F(ZitBltVisibilityCmdTest, AllFollowsTheNamesOnlyWhenEveryOneAgrees) {
 
 TEST_F(ZitBltVisibilityCmdTest, SeveralActivitiesShowTheFirstOnesStatesAndAllTakeEachChange) {
   Manager("S2")->SetZitBltStatus("Inputs", 0);
-  ASSERT_TRUE(StartOn({"S1", "S2", "L"})) << driver.LastError();
+  ASSERT_TRUE(StartOn({"S1", "S2", "L", "S3"})) << driver.LastError();
   EXPECT_NE(Dialog().find(Button("Inputs", "checked", 1)), std::string::npos) << Dialog();
   ASSERT_TRUE(Toggle("Outputs"));
   for (const char* label : {"S1", "S2"}) {
@@ -170,6 +173,11 @@ TEST_F(ZitBltVisibilityCmdTest, SeveralActivitiesShowTheFirstOnesStatesAndAllTak
   EXPECT_TRUE(Shown("S1", "Inputs"));
   EXPECT_FALSE(Shown("S2", "Inputs")) << "only the name clicked changes";
   EXPECT_TRUE(Shown("L", "Status")) << "an activity without that name is skipped";
+  EXPECT_EQ(Status("S3", "Outputs"), 0) << "also on an activity that no viewer shows";
+  bool shown = true;
+  VORIZitBltVisibility_var(VORBaseUnknown_var(driver.FindObject("S3")))
+      ->GetZitBltShown("Outputs", shown);
+  EXPECT_FALSE(shown);
   ASSERT_TRUE(Toggle("All"));
   EXPECT_EQ(Status("L", "Status"), 0) << "All reaches every ZitBlt of every activity";
   ASSERT_TRUE(driver.PressOK(kDialog));

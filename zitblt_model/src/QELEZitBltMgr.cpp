@@ -193,6 +193,12 @@ HRESULT QELEZitBltMgr::GetZitBltNames(VORListValVORUnicodeString*& names) {
 }
 
 HRESULT QELEZitBltMgr::SetZitBltStatus(const VORUnicodeString& name, unsigned char status) {
+  // An activity that no viewer shows yet gets its ZitBlts first, so that a change made to
+  // several selected activities is kept for each of them.
+  if (!_initialised) {
+    BuildZitBlts();
+    _initialised = true;
+  }
   HRESULT result = S_OK;
   if (name == VORUnicodeString("All")) {
     // "All" stands for every ZitBlt of the activity, so that the chart shows what the dialog's
