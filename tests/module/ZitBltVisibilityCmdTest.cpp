@@ -15,6 +15,7 @@
 #include "VORFileIO.h"
 #include "VORIZitBltVisibility.h"
 #include "VORModelDoor.h"
+#include "VORViewer.h"
 #include "ZitBltTestSupport.h"
 
 namespace {
@@ -105,7 +106,10 @@ TEST_F(ZitBltVisibilityCmdTest, OneNameHasNoAllButtonAndItsButtonSitsOnRowOne) {
             "Dialog \"QELFpaZitBltHideShowDlg\"\n"
             "  Frame \"ZitBlts\" title=\"ZitBlts\" at 0,0\n" +
                 Button("Status", "checked", 1));
+  VORViewer* chart = driver.FindWindow("")->GetViewer();
+  const int draws = chart->GetDrawRequestCount();
   ASSERT_TRUE(Toggle("Status")) << driver.LastError();
+  EXPECT_GT(chart->GetDrawRequestCount(), draws) << "the chart is asked to repaint";
   EXPECT_EQ(Status("L", "Status"), 0);
   EXPECT_FALSE(Shown("L", "Status")) << "applied at once, before OK";
   EXPECT_FALSE(Toggle("All"));

@@ -220,6 +220,10 @@ HRESULT QELEZitBltMgr::SetZitBltStatus(const VORUnicodeString& name, unsigned ch
 }
 
 void QELEZitBltMgr::Announce() {
+  // A status shows or hides bags without a redraw of its own: one for the whole change (the
+  // reps share their viewer, and the viewer coalesces requests).
+  if (!_zitBlts.empty())
+    _zitBlts.front().second->ReDraw();
   VORBaseUnknown* activity = GetExtendedObject();
   if (VORIModelEvents_var events{VORBaseUnknown_var(activity)}; events) {
     auto modify =

@@ -78,9 +78,11 @@ class QELZitBltRep : public VORCommand {
   // The base ZitBlt has no expanded content to empty: E_FAIL.
   HRESULT EmptyExpandedBagRep();
 
+  // Asks the viewer the rep was built in to repaint (nothing before BuildRep).
+  virtual void ReDraw();
+
  protected:
   ~QELZitBltRep() override;
-  virtual void ReDraw();
   void SetTranslation(double x, double y);
 
   int _btnState = 0;
