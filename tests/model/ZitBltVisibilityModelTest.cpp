@@ -42,11 +42,11 @@ TEST(ZitBltVisibilityModelTest, ChangesAreNotifiedCountedAndUndoneToNothingRecor
   RecordModify(l.s1, whats, id);
   const long before = door.ChangeCount();
   VORChangeLog log;
-  door.SetRecorder(&log);
+  VORChangeLog* outer = door.SetRecorder(&log);
   EXPECT_EQ(s1->SetZitBltShown("ResourceList", false), S_OK);
   EXPECT_EQ(s1->SetZitBltShown("ResourceList", false), S_OK);  // unchanged: no change at all
   EXPECT_EQ(s1->SetZitBltShown("All", true), S_OK);
-  door.SetRecorder(nullptr);
+  door.SetRecorder(outer);
   EXPECT_EQ(door.ChangeCount(), before + 2);
   EXPECT_EQ(whats, (std::vector<std::string>{"zitblt", "zitblt"}));
   EXPECT_EQ(Visibility(l.s1), "All=1 ResourceList=0");

@@ -223,9 +223,9 @@ TEST_F(ZitBltVisibilityCmdTest, AClickIsOneUndoableChangeOfTheDocument) {
   VORModelDoor& door = driver.GetDocument()->GetDoor();
   ASSERT_TRUE(StartOn({"S1", "S2"})) << driver.LastError();
   VORChangeLog log;
-  door.SetRecorder(&log);
+  VORChangeLog* outer = door.SetRecorder(&log);
   ASSERT_TRUE(Toggle("All"));
-  door.SetRecorder(nullptr);
+  door.SetRecorder(outer);
   EXPECT_TRUE(driver.GetDocument()->IsModified());
   bool shown = true;
   EXPECT_EQ(VORIZitBltVisibility_var(VORBaseUnknown_var(driver.FindObject("S2")))
