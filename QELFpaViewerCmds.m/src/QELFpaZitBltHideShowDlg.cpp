@@ -4,6 +4,7 @@
 #include "QELIZitBltMgr.h"
 #include "VORApplicationFrame.h"
 #include "VORDlgStyles.h"
+#include "VORMsgCatalog.h"
 
 namespace {
 void Trace(const char* text) {
@@ -20,6 +21,8 @@ int StateOf(bool checked) {
 QELFpaZitBltHideShowDlg::QELFpaZitBltHideShowDlg(VORListValVORBaseUnknown_var* activities)
     : VORDlgDialog(VORApplicationFrame::GetApplicationFrame()->GetMainWindow(),
                    "QELFpaZitBltHideShowDlg", 0x40401) {
+  // The window's title, as the host's dialog resources would give it.
+  SetTitle(VORMsgCatalog::BuildMessage("QELFpaZitBltHideShowDlg", "Title", "Show/Hide ZitBlts"));
   if (activities != nullptr)
     _activities = *activities;
   Build();

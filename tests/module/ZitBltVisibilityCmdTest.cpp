@@ -103,7 +103,7 @@ class ZitBltVisibilityCmdTest : public ::testing::Test {
 TEST_F(ZitBltVisibilityCmdTest, OneNameHasNoAllButtonAndItsButtonSitsOnRowOne) {
   ASSERT_TRUE(StartOn({"L"})) << driver.LastError();
   EXPECT_EQ(Dialog(),
-            "Dialog \"QELFpaZitBltHideShowDlg\"\n"
+            "Dialog \"QELFpaZitBltHideShowDlg\" title=\"Show/Hide ZitBlts\"\n"
             "  Frame \"ZitBlts\" title=\"ZitBlts\" at 0,0\n" +
                 Button("Status", "checked", 1));
   VORViewer* chart = driver.FindWindow("")->GetViewer();
@@ -121,7 +121,7 @@ TEST_F(ZitBltVisibilityCmdTest, OneNameHasNoAllButtonAndItsButtonSitsOnRowOne) {
 TEST_F(ZitBltVisibilityCmdTest, SeveralNamesUnderAllWhichSetsEveryOne) {
   ASSERT_TRUE(StartOn({"S1"})) << driver.LastError();
   EXPECT_EQ(Dialog(),
-            "Dialog \"QELFpaZitBltHideShowDlg\"\n"
+            "Dialog \"QELFpaZitBltHideShowDlg\" title=\"Show/Hide ZitBlts\"\n"
             "  Frame \"ZitBlts\" title=\"ZitBlts\" at 0,0\n"
             "    CheckButton \"All\" title=\"All\" value=\"checked\" at 0,0\n" +
                 Button("Inputs", "checked", 1) + Button("Outputs", "checked", 2) +
