@@ -1,4 +1,6 @@
 // Registers the ZitBlt model's extensions when the module is loaded.
+#include "QELEListZitBltItem.h"
+#include "QELEListZitBltItemStatePI.h"
 #include "QELEZitBltCBSubscriber.h"
 #include "QELEZitBltMgr.h"
 #include "QELZitBltScriptStep.h"
@@ -11,5 +13,19 @@ extern "C" void VORInitModule() {
   VORExtensionRegistry::Register(
       "PhysicalActivity", QELIZitBltCBSubscriber::IID(),
       []() -> VORExtension* { return new QELEZitBltCBSubscriber(); }, VORExtensionKind::Data);
+  // What the lists show of the model objects.
+  for (const char* type : {"ProductInput", "QELMfgAssy"})
+    VORExtensionRegistry::Register(
+        type, QELIListZitBltItem::IID(),
+        []() -> VORExtension* { return new QELEListZitBltItemPI(); }, VORExtensionKind::Code);
+  VORExtensionRegistry::Register(
+      "ProductOutput", QELIListZitBltItem::IID(),
+      []() -> VORExtension* { return new QELEListZitBltItemPO(); }, VORExtensionKind::Code);
+  VORExtensionRegistry::Register(
+      "ASMPRODUCT", QELIListZitBltItem::IID(),
+      []() -> VORExtension* { return new QELEListZitBltItemResource(); }, VORExtensionKind::Code);
+  VORExtensionRegistry::Register(
+      "ProductInput", QELIListZitBltItemState::IID(),
+      []() -> VORExtension* { return new QELEListZitBltItemStatePI(); }, VORExtensionKind::Data);
   QELRegisterZitBltScriptStep();
 }
