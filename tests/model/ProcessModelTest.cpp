@@ -262,13 +262,20 @@ TEST(BIWItemInfoTest, FirstListIsOwnOutputsSecondIsChildOutputsNotConsumedInside
   List* list = nullptr;
   info->GetFirstItemList(list);
   EXPECT_EQ(Ids(list), IdOf(l.s2Out));
+  // The weld's Floor assy is the station's own output already: not handed on twice.
   info->GetSecondItemList(list);
-  EXPECT_EQ(Ids(list), IdOf(weldOut));
+  EXPECT_EQ(Ids(list), "");
+  VORBaseUnknown_var trim, trimOut, trimOut2;
+  VORIProduct_var(l.doc->GetRootProduct())->AddChild("Trim", trim);
+  VORISPPFlowMgt_var(l.weld)->AddProductOutput(trim, trimOut);
+  VORISPPFlowMgt_var(l.load)->AddProductOutput(trim, trimOut2);
+  info->GetSecondItemList(list);
+  EXPECT_EQ(Ids(list), IdOf(trimOut2)) << "one line per item: the first child's";
   info->GetActivityList(list);
   EXPECT_EQ(Ids(list), IdOf(l.load) + " " + IdOf(l.weld));
   info->GetConsumedItems(list);
   EXPECT_EQ(Ids(list), IdOf(l.panel) + " " + IdOf(sub));
-  EXPECT_TRUE(info->IsListedOutput(weldOut));
+  EXPECT_FALSE(info->IsListedOutput(weldOut));
   EXPECT_FALSE(info->IsListedOutput(loadOut));
   EXPECT_TRUE(info->AcceptsOutputTransfer(l.s2Out, l.s3));
   EXPECT_FALSE(info->AcceptsOutputTransfer(l.s2Out, l.weld)) << "welds do not take outputs";
@@ -279,4 +286,72 @@ TEST(BIWItemInfoTest, FirstListIsOwnOutputsSecondIsChildOutputsNotConsumedInside
   // A station without children lists itself.
   QELIBIWItemInfo_var(l.s1)->GetActivityList(list);
   EXPECT_EQ(Ids(list), IdOf(l.s1));
+}
+
+TEST(BIWItemInfoTest, CoveredItemsAreMadeInsideOrTakenThroughAnAssignedInputOfTheActivity) {
+  SmallLine l;
+  VORBaseUnknown_var sub, loadOut, bracketIn, unassignedIn;
+  VORIProduct_var(l.doc->GetRootProduct())->AddChild("Sub assy", sub);
+  VORISPPFlowMgt_var(l.load)->AddProductOutput(sub, loadOut);
+  VORISPPFlowMgt_var(l.s2)->AddProductInput(l.bracket, bracketIn);
+  VORISPPItemMgt_var(l.s2)->AssignItem(l.bracket, bracketIn);
+  VORBaseUnknown_var trim;
+  VORIProduct_var(l.doc->GetRootProduct())->AddChild("Trim", trim);
+  VORISPPFlowMgt_var(l.s2)->AddProductInput(trim, unassignedIn);  // an input, not assigned
+  List* list = nullptr;
+  QELIBIWItemInfo_var(l.s2)->GetCoveredItems(list);
+  EXPECT_EQ(Ids(list), IdOf(sub) + " " + IdOf(l.panel) + " " + IdOf(l.bracket));
+  // A station without children covers what it makes itself.
+  QELIBIWItemInfo_var(l.s3)->GetCoveredItems(list);
+  EXPECT_EQ(Ids(list), "");
+  VORBaseUnknown_var s3Out;
+  VORISPPFlowMgt_var(l.s3)->AddProductOutput(trim, s3Out);
+  QELIBIWItemInfo_var(l.s3)->GetCoveredItems(list);
+  EXPECT_EQ(Ids(list), IdOf(trim));
+}
+
+TEST(JoiningCycleTimeTest, PointAndCurveFasteningTimesFollowTheirAttributesThroughTheDoor) {
+  SmallLine l;
+  VORBaseUnknown_var arc, seal;
+  VORISPPChildManagement_var(l.s3)->CreateChild("BIWActivityArcWelding", arc);
+  VORISPPChildManagement_var(l.s3)->CreateChild("BIWActivitySealantApplication", seal);
+  QELIBIWWeldingActivity_var weld(l.weld);
+  ASSERT_TRUE(weld);
+  EXPECT_FALSE(QELIBIWCurveFasteningActivity_var(l.weld));
+  EXPECT_FALSE(QELIBIWWeldingActivity_var(arc));
+  EXPECT_FALSE(QELIBIWWeldingActivity_var(l.s2)) << "stations are no joining activities";
+  auto time = [](VORBaseUnknown* a) {
+    double t = -1;
+    VORISPPAbstractActivity_var(a)->GetActivityTime(t);
+    return t;
+  };
+  auto set = [&](VORBaseUnknown* a, const char* name, const VORAttributeValue& v) {
+    l.doc->GetDoor().SetUserAttribute(a, name, v);
+  };
+  VORISPPAbstractActivity_var(l.weld)->SetActivityTime(7);
+  EXPECT_EQ(weld->UpdateCycleTime(), S_FALSE) << "no joints given";
+  set(l.weld, "NumberOfPoints", VORAttributeValue::Long(12));
+  set(l.weld, "TimePerPoint", VORAttributeValue::String("fast"));
+  EXPECT_EQ(weld->UpdateCycleTime(), S_FALSE);
+  EXPECT_EQ(time(l.weld), 7.0);
+  set(l.weld, "TimePerPoint", VORAttributeValue::Double(2.5));
+  VORChangeLog log;
+  l.doc->GetDoor().SetRecorder(&log);
+  EXPECT_EQ(weld->UpdateCycleTime(), S_OK);
+  EXPECT_EQ(time(l.weld), 30.0);
+  EXPECT_EQ(weld->UpdateCycleTime(), S_FALSE) << "already so";
+  l.doc->GetDoor().SetRecorder(nullptr);
+  l.doc->GetDoor().Undo(log);
+  EXPECT_EQ(time(l.weld), 7.0) << "undone as one step";
+
+  QELIBIWCurveFasteningActivity_var curve(arc);
+  ASSERT_TRUE(curve);
+  ASSERT_TRUE(QELIBIWCurveFasteningActivity_var(seal));
+  set(arc, "SeamLength", VORAttributeValue::Long(900));
+  EXPECT_EQ(curve->UpdateCycleTime(), S_FALSE) << "no speed";
+  set(arc, "SeamSpeed", VORAttributeValue::Long(0));
+  EXPECT_EQ(curve->UpdateCycleTime(), S_FALSE) << "no division by zero";
+  set(arc, "SeamSpeed", VORAttributeValue::Double(50));
+  EXPECT_EQ(curve->UpdateCycleTime(), S_OK);
+  EXPECT_EQ(time(arc), 18.0);
 }

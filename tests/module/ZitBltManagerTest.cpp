@@ -1,6 +1,8 @@
 #include <map>
 
 #include "QELBaseListZitBltCmd.h"
+#include "QELEZitBltCBSubscriber.h"
+#include "QELIUpdateManufAssly.h"
 #include "QELIPertNode.h"
 #include "QELIZitBltCBSubscriber.h"
 #include "QELIZitBltMgr.h"
@@ -305,6 +307,84 @@ TEST_F(ZitBltManagerTest, SubscriberPassesOnlyItsOwnActivitysChangesUnlessMuted)
   QELBaseListZitBltCmd* command = nullptr;
   EXPECT_EQ(subscriber->GetUpdateCommand("ProductOutput", &command), E_FAIL);
   EXPECT_EQ(subscriber->GetUpdateCommand("BIWStationStatusBars", nullptr), E_FAIL);
+}
+
+TEST_F(ZitBltManagerTest, UnassignmentsRefreshTwiceAndADeletedOwnerEndsItsCommands) {
+  Manager(grouping)->BuildZitBltReps(viewer);
+  Manager(station)->BuildZitBltReps(viewer);
+  log->clear();
+  VOREventPublisher* publisher = VORISPPActivityModificationEvents_var(root)->GetEventPublisher();
+  auto dispatch = [&](VORBaseUnknown* father, SPPModifyKind kind) {
+    auto n = VORHandle<VORSPPActivityNotification>::Adopt(
+        new VORSPPActivityNotification(father, loading, kind));
+    publisher->Dispatch(VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(), n);
+  };
+  const std::vector<std::string> once = {
+      "S/BIWStationStatusBars/none", "G/BIWStationStatusBars/none", "G/BIWGroupingStatusBars/none",
+      "G/BIWStationStatusBars/none"};
+  dispatch(station, SPPItemUnassigned);
+  std::vector<std::string> twice = once;
+  twice.insert(twice.end(), once.begin(), once.end());
+  EXPECT_EQ(*log, twice);
+  log->clear();
+
+  // The station's deletion (kinds 3 on the grouping, then 8 on the station) ends the station's
+  // command; the subscriber forgets it and nobody releases it twice.
+  QELIZitBltCBSubscriber_var subscriber(station);
+  QELBaseListZitBltCmd* command = nullptr;
+  ASSERT_EQ(subscriber->GetUpdateCommand("BIWStationStatusBars", &command), S_OK);
+  VORHandle<QELBaseListZitBltCmd> held(command);
+  ASSERT_EQ(doc->GetDoor().RemoveNode(station), S_OK);
+  EXPECT_EQ(subscriber->GetUpdateCommand("BIWStationStatusBars", &command), E_FAIL);
+  log->clear();
+  held->OnActivityCallback(
+      "", nullptr,
+      VORHandle<VORSPPActivityNotification>::Adopt(
+          new VORSPPActivityNotification(station, station, SPPActivityDeleted)),
+      nullptr, 0);  // a second end changes nothing
+  held = NULL_var;
+  VORDeferredDeletion::Drain();
+  Manager(station)->UpdateZitBlt("BIWStationStatusBars");
+  EXPECT_TRUE(log->empty());
+  EXPECT_EQ(subscriber->Unsubscribe(), S_OK);
+}
+
+TEST_F(ZitBltManagerTest, AnAssemblyUpdateRefreshesWhileMutedAndLeavesTheFlagClearedElsewhere) {
+  Manager(grouping)->BuildZitBltReps(viewer);
+  Manager(station)->BuildZitBltReps(viewer);
+  log->clear();
+  VOREventPublisher* publisher = VORISPPActivityModificationEvents_var(root)->GetEventPublisher();
+  auto dispatch = [&](VORBaseUnknown* father, SPPModifyKind kind) {
+    auto n = VORHandle<VORSPPActivityNotification>::Adopt(
+        new VORSPPActivityNotification(father, loading, kind));
+    publisher->Dispatch(VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(), n);
+  };
+  QELIZitBltCBSubscriber_var subscriber(station);
+  QELIUpdateManufAssly_var update(root);
+  subscriber->SetCallbacksSuspended(true);
+  update->SetUpdateInProgress(true);
+  // Only the loading's change: no command cares, yet the station's subscriber heard of another
+  // activity during the update and leaves the flag cleared.
+  dispatch(loading, SPPItemAssigned);
+  EXPECT_TRUE(log->empty());
+  EXPECT_FALSE(subscriber->AreCallbacksSuspended());
+  // Its own change refreshes, and the flag it found is put back.
+  subscriber->SetCallbacksSuspended(true);
+  QELBaseListZitBltCmd* command = nullptr;
+  ASSERT_EQ(subscriber->GetUpdateCommand("BIWStationStatusBars", &command), S_OK);
+  VORHandle<VORSPPActivityNotification> own = VORHandle<VORSPPActivityNotification>::Adopt(
+      new VORSPPActivityNotification(station, loading, SPPItemAssigned));
+  dynamic_cast<QELEZitBltCBSubscriber*>(subscriber.get())
+      ->OnViewsChange(VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(), own,
+                      nullptr, 0);
+  EXPECT_EQ(log->size(), 4u);
+  EXPECT_TRUE(subscriber->AreCallbacksSuspended());
+  // Without an update, muted means muted.
+  update->SetUpdateInProgress(false);
+  log->clear();
+  dispatch(station, SPPItemAssigned);
+  EXPECT_TRUE(log->empty());
+  subscriber->SetCallbacksSuspended(false);
 }
 
 TEST_F(ZitBltManagerTest, MissingConfigurationGivesNoZitBltsUntilTheFileAppears) {

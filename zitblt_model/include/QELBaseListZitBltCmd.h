@@ -7,11 +7,13 @@
 
 #include "VORCommand.h"
 #include "VORIDOMDocument.h"
+#include "VORISPPActivity.h"
+#include "VORLists.h"
 #include "VORModelTypes.h"
 #include "VORUnicodeString.h"
 
 class QELBaseScrollListZitBltRep;
-class VORISPPActivity;
+class QELEZitBltCBSubscriber;
 
 class QELBaseListZitBltCmd : public VORCommand {
   VOR_DECLARE_CLASS(QELBaseListZitBltCmd, VORCommand)
@@ -50,8 +52,22 @@ class QELBaseListZitBltCmd : public VORCommand {
   virtual bool HandleEvent(SPPModifyKind kind, VORBaseUnknown* son);
   // The parsed status-bar configuration file, null when it is missing or ill-formed.
   VORIDOMDocument_var GetUserDefinedAttributeDOMDoc();
+  // A whole-number value of the owner's attribute name, or -1. The owner's own attribute is
+  // returned as it is (0 included; a text gives -1); without one, the planning hub's
+  // user-defined attribute of that name, where 0 also gives -1.
+  int GetAttributeValue(const VORUnicodeString& name);
+  // Appends to items the items assigned to activity itself, in assignment order.
+  void GetFirstFirstAssignedItems(const VORISPPActivity_var& activity,
+                                  VORListValVORBaseUnknown_var& items);
 
  private:
+  friend class QELEZitBltCBSubscriber;
+  // Who releases the creator's reference: the creator, the subscriber's table, or nobody more
+  // (already handed to deferred deletion).
+  enum class Holder { Creator, Subscriber, Released };
+  // The owner was deleted: drop the callback and end, settling the reference with its holder.
+  void EndWithOwner();
+
   static VORUnicodeString GetConfigFile();
   static void InitializeData();
   void RefreshOwnerAndAncestors();
@@ -60,6 +76,8 @@ class QELBaseListZitBltCmd : public VORCommand {
   int _callbackHandle = -1;
   VORUnicodeString _podName;
   VORHandle<VOREventPublisher> _callbackPublisher;
+  Holder _holder = Holder::Creator;
+  QELEZitBltCBSubscriber* _subscriber = nullptr;  // while _holder is Subscriber
 
   static VORIDOMDocument_var _spXmlDocument;
   static bool _xmlParsed;

@@ -24,12 +24,16 @@ class QELEZitBltCBSubscriber : public VORExtension, public QELIZitBltCBSubscribe
   // The views-change callback (public for the tests that dispatch by hand).
   void OnViewsChange(const std::string& event, VORNotification* notification, void* clientData,
                      VORCallbackId id);
+  // A command of the table ended with its activity: it releases the table's reference itself.
+  void ForgetEndedCommand(QELBaseListZitBltCmd* command);
 
  protected:
   ~QELEZitBltCBSubscriber() override;
 
  private:
   void CreateUpdateCommands();
+  // Hands every command of the table to deferred deletion and empties the table.
+  void DeleteCommands();
   void DropCallback();
 
   bool _subscribed = false;

@@ -1,10 +1,18 @@
 #include "QELBaseListZitBltCmd.h"
 
+#include "QELEZitBltCBSubscriber.h"
 #include "QELIZitBltMgr.h"
 #include "QELZitBltConfiguration.h"
 #include "QELZitBltRep.h"
 #include "VORISPPActivity.h"
 #include "VORISPPActivityModificationEvents.h"
+#include "VORDocument.h"
+#include "VORIIPDAdapter.h"
+#include "VORIIPDAttributeMgt.h"
+#include "VORISPPItem.h"
+#include "VORISPPItemMgt.h"
+#include "VORISpecObject.h"
+#include "VORIUserAttributes.h"
 #include "VORSPPActivityNotification.h"
 
 VORIDOMDocument_var QELBaseListZitBltCmd::_spXmlDocument;
@@ -81,7 +89,7 @@ void QELBaseListZitBltCmd::OnActivityCallback(const char*, void*, VORNotificatio
   if (HandleEvent(kind, activityNotification->GetSon()))
     RefreshOwnerAndAncestors();
   else if (kind == SPPActivityDeleted) {
-    RemoveCallbacks();
+    EndWithOwner();
     return;
   }
   // An unassignment refreshes a second time, accepted or not.
@@ -131,4 +139,69 @@ bool QELBaseListZitBltCmd::RemoveCallbacks() {
   _callbackPublisher = NULL_var;
   _callbackHandle = -1;
   return true;
+}
+
+void QELBaseListZitBltCmd::EndWithOwner() {
+  RemoveCallbacks();
+  switch (_holder) {
+    case Holder::Released:
+      return;  // its release is queued already
+    case Holder::Subscriber:
+      if (_subscriber != nullptr)
+        _subscriber->ForgetEndedCommand(this);
+      break;
+    case Holder::Creator:
+      break;
+  }
+  _holder = Holder::Released;
+  _subscriber = nullptr;
+  RequestDelayedDestruction();
+}
+
+int QELBaseListZitBltCmd::GetAttributeValue(const VORUnicodeString& name) {
+  VORAttributeValue value;
+  if (VORIUserAttributes_var attributes(_owner); attributes)
+    attributes->GetAttributeValue(name, value);
+  switch (value.type) {
+    case VORAttributeLong:
+      return static_cast<int>(value.longValue);
+    case VORAttributeDouble:
+      return static_cast<int>(value.doubleValue);
+    case VORAttributeString:
+      return -1;
+    case VORAttributeNone:
+      break;
+  }
+  // The planning hub's user-defined attribute; there 0 and "no value" both give -1.
+  VORISpecObject_var spec(_owner);
+  VORProcess* document = spec ? spec->GetDocument() : nullptr;
+  const VORBaseUnknown_var documentObject(document);
+  if (!VORIIPDAdapter_var(documentObject))
+    return -1;
+  VORIIPDAttributeMgt_var hub(documentObject);
+  VORAttributeValue hubValue;
+  if (!hub || FAILED(hub->GetUserDefinedAttribute(_owner.get(), name, hubValue)))
+    return -1;
+  int result = -1;
+  if (hubValue.type == VORAttributeLong)
+    result = static_cast<int>(hubValue.longValue);
+  else if (hubValue.type == VORAttributeDouble)
+    result = static_cast<int>(hubValue.doubleValue);
+  return result == 0 ? -1 : result;
+}
+
+void QELBaseListZitBltCmd::GetFirstFirstAssignedItems(const VORISPPActivity_var& activity,
+                                                      VORListValVORBaseUnknown_var& items) {
+  VORISPPItemMgt_var itemMgt(activity);
+  VORListValVORBaseUnknown_var* assigned = nullptr;
+  if (!itemMgt ||
+      FAILED(itemMgt->GetAssignedItems(assigned, "Item", VORISPPItemMgt::FirstAssigned)))
+    return;
+  if (assigned == nullptr)
+    return;
+  for (const VORBaseUnknown_var& object : *assigned) {
+    if (VORISPPItem_var(object))
+      items.Append(object);
+  }
+  delete assigned;
 }

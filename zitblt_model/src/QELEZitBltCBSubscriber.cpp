@@ -20,10 +20,21 @@ VORString Narrow(const VORUnicodeString& s) {
 }  // namespace
 
 QELEZitBltCBSubscriber::~QELEZitBltCBSubscriber() {
-  for (auto& entry : _commands)
-    VORCommandDeletion(entry.second);
-  _commands.clear();
+  DeleteCommands();
   DropCallback();
+}
+
+void QELEZitBltCBSubscriber::DeleteCommands() {
+  for (auto& entry : _commands) {
+    entry.second->_holder = QELBaseListZitBltCmd::Holder::Released;
+    entry.second->_subscriber = nullptr;
+    VORCommandDeletion(entry.second);
+  }
+  _commands.clear();
+}
+
+void QELEZitBltCBSubscriber::ForgetEndedCommand(QELBaseListZitBltCmd* command) {
+  std::erase_if(_commands, [command](const auto& entry) { return entry.second == command; });
 }
 
 HRESULT QELEZitBltCBSubscriber::Subscribe() {
@@ -76,10 +87,13 @@ void QELEZitBltCBSubscriber::CreateUpdateCommands() {
     bool known = false;
     for (auto& entry : _commands)
       known = known || entry.first == d.name;
-    if (known)
+    if (known) {
       VORCommandDeletion(command);  // one command per ZitBlt name: the first is kept
-    else
-      _commands.emplace_back(d.name, command);
+      continue;
+    }
+    command->_holder = QELBaseListZitBltCmd::Holder::Subscriber;
+    command->_subscriber = this;
+    _commands.emplace_back(d.name, command);
   }
 }
 
@@ -93,9 +107,7 @@ void QELEZitBltCBSubscriber::DropCallback() {
 
 HRESULT QELEZitBltCBSubscriber::Unsubscribe() {
   if (_subscribed) {
-    for (auto& entry : _commands)
-      VORCommandDeletion(entry.second);
-    _commands.clear();
+    DeleteCommands();
     _subscribed = false;
   }
   DropCallback();

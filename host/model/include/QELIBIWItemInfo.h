@@ -3,10 +3,11 @@
 //  - A's own items: the items assigned to A (VORISPPItemMgt, mode AssignedHere).
 //  - produced items: the items of the product outputs of A and of the children.
 //  - consumed items: the items of the product inputs of A and of the children.
-// The two item lists are what the output list shows: the first list holds what A produces
-// (outputs of A itself), the second what A's children produce that is not consumed again
-// inside A (the sub-results a group hands on). For a station without children the second
-// list is empty.
+// The two item lists are what A's output list shows: the first holds what A produces (its own
+// outputs), the second what A's children produce that nothing inside A consumes and that A
+// does not declare itself (the sub-results a group hands on). The activity list and the
+// covered items make A's full input list: the items assigned to the listed activities, less
+// the covered ones, are what A takes from outside without an input of its own.
 #pragma once
 
 #include "VORHandle.h"
@@ -18,10 +19,15 @@ class QELIBIWItemInfo : public virtual VORBaseUnknown {
   // New lists the caller deletes.
   // The product outputs of the activity itself ("ProductOutput" objects).
   virtual HRESULT GetFirstItemList(VORListValVORBaseUnknown_var*& items) = 0;
-  // Product outputs of the child activities whose item no child or the activity consumes.
+  // Product outputs of the child activities whose item neither a child nor the activity
+  // consumes, and that no output of the activity itself produces.
   virtual HRESULT GetSecondItemList(VORListValVORBaseUnknown_var*& items) = 0;
   // The child activities (and for a station without children, the activity itself).
   virtual HRESULT GetActivityList(VORListValVORBaseUnknown_var*& activities) = 0;
+  // The items the full input list does not repeat from the listed activities: the items they
+  // produce (intermediate results made inside) and the items the activity takes through a
+  // product input of its own and has assigned (listed already), without duplicates.
+  virtual HRESULT GetCoveredItems(VORListValVORBaseUnknown_var*& items) = 0;
   // The items consumed inside: the items of the product inputs of the activity and its
   // children, without duplicates.
   virtual HRESULT GetConsumedItems(VORListValVORBaseUnknown_var*& items) = 0;

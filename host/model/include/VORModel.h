@@ -2,7 +2,9 @@
 #pragma once
 
 #include "QELIBIWActivityStation.h"
+#include "QELIBIWCurveFasteningActivity.h"
 #include "QELIBIWItemInfo.h"
+#include "QELIBIWWeldingActivity.h"
 #include "QELIMfgAssembly.h"
 #include "QELIMfgAssemblyModificationEvents.h"
 #include "QELIUpdateManufAssly.h"

@@ -227,6 +227,7 @@ class VORBIWItemInfoImpl : public virtual QELIBIWItemInfo {
   HRESULT GetFirstItemList(VORListValVORBaseUnknown_var*& items) override;
   HRESULT GetSecondItemList(VORListValVORBaseUnknown_var*& items) override;
   HRESULT GetActivityList(VORListValVORBaseUnknown_var*& activities) override;
+  HRESULT GetCoveredItems(VORListValVORBaseUnknown_var*& items) override;
   HRESULT GetConsumedItems(VORListValVORBaseUnknown_var*& items) override;
   HRESULT GetReplaceableProductIOs(VORListValVORBaseUnknown_var*& productIOs) override;
   bool IsListedOutput(VORBaseUnknown* productOutput) override;

@@ -271,9 +271,14 @@ HRESULT VORBIWItemInfoImpl::GetSecondItemList(VORListValVORBaseUnknown_var*& ite
   const auto children = ChildActivities(self);
   for (VORActivityImpl* c : children)
     addConsumed(c);
+  // What the activity declares itself is in the first list already.
+  for (auto& io : self->productIOs) {
+    if (!io->input && io->Item())
+      consumed.insert(io->Item());
+  }
   for (VORActivityImpl* c : children) {
     for (auto& io : c->productIOs) {
-      if (!io->input && io->Item() && consumed.count(io->Item()) == 0)
+      if (!io->input && io->Item() && consumed.insert(io->Item()).second)
         AppendIO(*items, io.get());
     }
   }
@@ -287,6 +292,30 @@ HRESULT VORBIWItemInfoImpl::GetActivityList(VORListValVORBaseUnknown_var*& activ
     activities->Append(VORBaseUnknown_var(Unk(Self())));
   for (VORActivityImpl* c : children)
     activities->Append(VORBaseUnknown_var(Unk(c)));
+  return S_OK;
+}
+
+HRESULT VORBIWItemInfoImpl::GetCoveredItems(VORListValVORBaseUnknown_var*& items) {
+  items = VORNewList();
+  VORActivityImpl* self = Self();
+  std::unordered_set<VORModelObject*> seen;
+  auto add = [&](VORModelObject* item) {
+    if (item != nullptr && seen.insert(item).second)
+      items->Append(VORBaseUnknown_var(Unk(item)));
+  };
+  auto children = ChildActivities(self);
+  if (children.empty() && VORKindCast<VORStationImpl>(self))
+    children.push_back(self);  // the activity list of a station without children
+  for (VORActivityImpl* a : children) {
+    for (auto& io : a->productIOs) {
+      if (!io->input)
+        add(io->Item());
+    }
+  }
+  for (auto& io : self->productIOs) {
+    if (io->input && io->Item() && self->FindLink(io->Item(), VORILinkableObject::ItemLink))
+      add(io->Item());
+  }
   return S_OK;
 }
 
