@@ -9,6 +9,7 @@
 #include "VORCommand.h"
 #include "VORISO.h"
 #include "VORModelForRep2D.h"
+#include "VORPixelImage.h"
 #include "VORUnicodeString.h"
 #include "VORViewer.h"
 
@@ -74,6 +75,9 @@ class QELZitBltRep : public VORCommand {
 
   // Icons are decoded once per process; this forgets them (tests that count live objects).
   static void ForgetIcons();
+  // A copy of the icon file's image (one reference, the caller's; converted in place by its
+  // users), found along the image search path; null when missing or unreadable.
+  static VORPixelImage* LoadIconImage(const VORUnicodeString& fileName);
 
   // The base ZitBlt has no expanded content to empty: E_FAIL.
   HRESULT EmptyExpandedBagRep();

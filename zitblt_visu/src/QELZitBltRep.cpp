@@ -28,8 +28,9 @@ std::map<VORUnicodeString, VORPixelImage_var>& IconCache() {
   return cache;
 }
 
-// A new image (one reference, the caller's) for the icon file, or null.
-VORPixelImage* LoadIcon(const VORUnicodeString& fileName) {
+}  // namespace
+
+VORPixelImage* QELZitBltRep::LoadIconImage(const VORUnicodeString& fileName) {
   auto& cache = IconCache();
   auto it = cache.find(fileName);
   if (it == cache.end()) {
@@ -48,6 +49,7 @@ VORPixelImage* LoadIcon(const VORUnicodeString& fileName) {
   return copy;
 }
 
+namespace {
 VORISO* CurrentISO() {
   VORFrmEditor* editor = VORFrmEditor::GetCurrentEditor();
   return editor != nullptr ? editor->GetISO() : nullptr;
@@ -156,7 +158,7 @@ void QELZitBltRep::BuildRep(VORViewer* viewer) {
 void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
   if (!_btnBag)
     return;
-  VORPixelImage* image = LoadIcon(_icon + VORUnicodeString(".bmp"));
+  VORPixelImage* image = LoadIconImage(_icon + VORUnicodeString(".bmp"));
   if (image == nullptr)
     return;
   image->AddRef();

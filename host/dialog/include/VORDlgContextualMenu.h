@@ -14,6 +14,11 @@ class VORDlgContextualMenu : public VORDlgControl {
   // The menu of a context notification, created (without parent, held by the notification) on
   // first use. Null for a null notification.
   static VORDlgContextualMenu* FromContext(VORContext* context);
+  // Takes every entry out of the menu (a receiver that replaces what others offered); returns
+  // how many were removed.
+  int RemoveAllItems();
+  // Takes the entry of that name out; false when there is none.
+  bool RemoveItem(const std::string& name);
 };
 
 class VORDlgPushItem : public VORDlgControl {

@@ -87,6 +87,9 @@ class VORDlgControl : public VORCommand {
 
  protected:
   ~VORDlgControl() override;
+  // Takes child out of this control: it is no longer listed, and an owned child is released.
+  // False when child is not below this control.
+  bool RemoveControl(VORDlgControl* child);
   // Dispatches a new notification on the publisher and releases it (takes the creator's
   // reference).
   void Send(VORDlgNotification* notification);

@@ -70,6 +70,21 @@ VORDlgControl* VORDlgControl::FindControl(const std::string& name) const {
   return nullptr;
 }
 
+bool VORDlgControl::RemoveControl(VORDlgControl* child) {
+  if (child == nullptr || child->GetFather() != this)
+    return false;
+  VORCommand_var keep(child);
+  child->SetFather(nullptr);
+  for (auto it = _owned.begin(); it != _owned.end(); ++it) {
+    if (it->get() == child) {
+      _owned.erase(it);
+      break;
+    }
+  }
+  Changed();
+  return true;
+}
+
 void VORDlgControl::Send(VORDlgNotification* notification) {
   auto keep = VORHandle<VORDlgNotification>::Adopt(notification);
   VORDlgControl_var self(this);

@@ -197,6 +197,21 @@ VORDlgContextualMenu* VORDlgContextualMenu::FromContext(VORContext* context) {
   return menu.get();
 }
 
+int VORDlgContextualMenu::RemoveAllItems() {
+  int removed = 0;
+  for (VORDlgControl* item : GetControls())
+    removed += RemoveControl(item) ? 1 : 0;
+  return removed;
+}
+
+bool VORDlgContextualMenu::RemoveItem(const std::string& name) {
+  for (VORDlgControl* item : GetControls()) {
+    if (item->GetName().str() == name)
+      return RemoveControl(item);
+  }
+  return false;
+}
+
 VORDlgPushItem::VORDlgPushItem(VORCommand* parent, const VORString& name, int style)
     : VORDlgControl(parent, name, style) {}
 
