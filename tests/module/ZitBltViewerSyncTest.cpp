@@ -20,8 +20,9 @@
 
 namespace {
 
-// The bundled configuration gives a station its status bar on the top edge (its list ZitBlts
-// wait for the scroll list rep and are left out).
+// The bundled configuration gives a station and a grouping four ZitBlts each: the input, output
+// and resource lists and the status bar on the top edge (two interactive models per ZitBlt).
+constexpr int kModelsPerNode = 2 * 4;
 constexpr const char* kStatusBar = "BIWStationStatusBars";
 
 class ZitBltViewerSyncTest : public ::testing::Test {
@@ -97,7 +98,7 @@ TEST_F(ZitBltViewerSyncTest, EveryActivityOfTheLevelGetsItsZitBltsOnItsNode) {
   QELIZitBltMgr_var(Object("G"))->GetZitBlt("BIWGroupingStatusBars", &groupingBar);
   EXPECT_NE(groupingBar, nullptr);
   EXPECT_EQ(StatusBar("S1"), nullptr);  // inside a collapsed grouping: none
-  EXPECT_EQ(driver.GetEditor()->GetISO()->GetElements().Size(), 2 * 3);
+  EXPECT_EQ(driver.GetEditor()->GetISO()->GetElements().Size(), 3 * kModelsPerNode);
 }
 
 TEST_F(ZitBltViewerSyncTest, ZitBltsFollowANodeDraggedInTheChart) {
@@ -125,7 +126,7 @@ TEST_F(ZitBltViewerSyncTest, LevelSwitchMovesTheZitBltsToTheNewLevel) {
   ASSERT_NE(StatusBar("S1"), nullptr);
   EXPECT_EQ(OffsetFromTopMiddle("S1").x, 0.0);
   EXPECT_EQ(OffsetFromTopMiddle("S1").y, 0.0);
-  EXPECT_EQ(driver.GetEditor()->GetISO()->GetElements().Size(), 2);
+  EXPECT_EQ(driver.GetEditor()->GetISO()->GetElements().Size(), kModelsPerNode);
   ASSERT_TRUE(OpenViewerOn("Line")) << driver.LastError();
   EXPECT_EQ(StatusBar("S1"), nullptr);
   ASSERT_NE(StatusBar("A"), nullptr);
@@ -150,7 +151,7 @@ TEST_F(ZitBltViewerSyncTest, ChildrenAddedOrRemovedInTheModelGainOrLoseTheirZitB
   EXPECT_FALSE(Viewer()->GetPertController()->IsInChart(c));
   EXPECT_EQ(manager->GetZitBlt(kStatusBar, &rep), E_FAIL);
   driver.DrainDeferred();
-  EXPECT_EQ(driver.GetEditor()->GetISO()->GetElements().Size(), 2 * 3);
+  EXPECT_EQ(driver.GetEditor()->GetISO()->GetElements().Size(), 3 * kModelsPerNode);
 }
 
 TEST_F(ZitBltViewerSyncTest, AClickOnTheButtonOpensAndClosesItAndADragSlidesItAlongItsEdge) {
@@ -184,8 +185,15 @@ TEST_F(ZitBltViewerSyncTest, ScriptPrintsEveryZitBltOfANode) {
   StatusBar("A")->GetPoDPosition(x, y);
   ASSERT_TRUE(script.Run("zitblts A\nzitblts Line\n")) << out.str();
   std::ostringstream expected;
-  expected << "> zitblts A\nZitBlt \"BIWStationStatusBars\": location \"topmiddle\", translation ("
-           << x << ", " << y << "), status 1, closed\n> zitblts Line\nno ZitBlts\n";
+  expected << "> zitblts A\n"
+           << "ZitBlt \"ProductInput\": location \"lefttop\", translation (" << x - 10 << ", " << y
+           << "), status 1, closed\n"
+           << "ZitBlt \"ProductOutput\": location \"righttop\", translation (" << x + 10 << ", "
+           << y << "), status 1, closed\n"
+           << "ZitBlt \"Resource\": location \"bottommiddle\", translation (" << x << ", " << y - 10
+           << "), status 1, closed\n"
+           << "ZitBlt \"BIWStationStatusBars\": location \"topmiddle\", translation (" << x << ", "
+           << y << "), status 1, closed\n> zitblts Line\nno ZitBlts\n";
   EXPECT_EQ(out.str(), expected.str());
   EXPECT_FALSE(script.Run("zitblts Nowhere\n"));
 }

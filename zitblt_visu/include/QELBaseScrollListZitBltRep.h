@@ -160,7 +160,6 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   std::vector<int> _kinds;
 
   unsigned char _validTarget = 0;
-  bool _buttonGrey = false;
   bool _notificationsAdded = false;
   bool _itemsMoved = false;
   float _itemDragX = 0.0f;

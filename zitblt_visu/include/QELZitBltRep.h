@@ -56,6 +56,10 @@ class QELZitBltRep : public VORCommand {
   VOR2DBagRep* GetZitBltExpanded() const { return _expandedBag.get(); }
   VOR2DManipulator* GetManipulator() const { return _manipulator; }
   bool IsButtonCollapse() const { return _collapsed != 0; }
+  // True while the button shows its icon in grey.
+  bool IsButtonGrey() const { return _grey; }
+  // The viewer given to BuildRep (null before).
+  VORViewer* GetViewer() const { return _viewer.get(); }
   int GetButtonState() const { return _btnState; }
 
   // Rebuilds the button's icon, in grey when grey is 1. Keeps the old icon when the file is
@@ -112,6 +116,7 @@ class QELZitBltRep : public VORCommand {
   VORModelForRep2D_var _btnModel;
   VORModelForRep2D_var _expandedModel;
   VORISO_var _iso;  // the set the models were added to
+  bool _grey = false;
 
  private:
   void SetShowMode(int mode);

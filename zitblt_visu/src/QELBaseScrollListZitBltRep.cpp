@@ -134,14 +134,12 @@ void QELBaseScrollListZitBltRep::BuildRep(VORViewer* viewer) {
     _contextCallback =
         AddCallback(_btnManipulator->GetEventPublisher(), VORManipulator::kVORContext,
                     [this](VORBaseUnknown*, VORNotification* n, void*) { OnZitBtnContextMenu(n); });
-  _buttonGrey = false;
   if (!_notificationsAdded)
     AddNotifications(_itemManipulator);
   if (!_items.IsEmpty()) {
     ReFreshZitBltReps(GetLocation());
   } else {
     SetZitbltButtonGrey(1);
-    _buttonGrey = true;
   }
 }
 
@@ -200,10 +198,8 @@ void QELBaseScrollListZitBltRep::AppendItem(VORBaseUnknown* item, int kindFlag) 
 }
 
 void QELBaseScrollListZitBltRep::RestoreButtonColour() {
-  if (!_buttonGrey)
-    return;  // already in colour: the icon need not be rebuilt
-  SetZitbltButtonGrey(0);
-  _buttonGrey = false;
+  if (IsButtonGrey())
+    SetZitbltButtonGrey(0);  // in colour already: the icon need not be rebuilt
 }
 
 void QELBaseScrollListZitBltRep::AppendScrollList(VORBaseUnknown* item, bool noGreyChange,
@@ -279,10 +275,8 @@ void QELBaseScrollListZitBltRep::RemoveAllItems(unsigned char greyButton) {
   EmptyExpandedBagRep();
   if (!_expandedBag)
     return;
-  if (greyButton == 1 && !_buttonGrey) {
+  if (greyButton == 1 && !IsButtonGrey())
     SetZitbltButtonGrey(1);
-    _buttonGrey = true;
-  }
   // The track and the scroller go with the bag's other children.
   if (_scroller)
     _scrollManipulator->RemoveElement(_scroller);

@@ -182,6 +182,7 @@ void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
   imageRep->SetAlphaMode(1);
 
   _btnBag->AddChild(imageRep);
+  _grey = grey == 1;
   image->Release();
   image->Release();
 }

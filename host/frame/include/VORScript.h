@@ -23,6 +23,7 @@ class VORScript {
 
   // Steps added by modules when they load (for example "zitblts <node>"): the words of the line
   // (the step first); false with a reason in error. A later registration replaces an earlier.
+  // A step registered as "print <what>" serves "print <what> ..." lines.
   using StepFunction = std::function<bool(VORDriver& driver, const std::vector<std::string>& words,
                                           std::ostream& out, std::string& error)>;
   static void RegisterStep(const std::string& step, StepFunction function);

@@ -213,6 +213,11 @@ bool VORScript::Execute(const std::vector<std::string>& w, std::string& error) {
   if (step == "close-window")
     return args(1, 1, "close-window <window>") && driverStep(_driver.CloseWindow(w[1]));
   if (step == "print") {
+    // "print <what> ..." steps added by modules are registered as "print <what>".
+    if (n >= 1) {
+      if (auto found = ModuleSteps().find("print " + w[1]); found != ModuleSteps().end())
+        return found->second(_driver, w, _out, error);
+    }
     if (!args(1, 2, "print windows|window [w]|cso|dialog [d]|menu|commands|check"))
       return false;
     const std::string& what = w[1];
