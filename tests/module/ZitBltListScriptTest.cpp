@@ -1,0 +1,151 @@
+// The list script steps on a viewer whose station lists its seven product inputs: opening and
+// closing, printing, scrolling with its clamps, the balloon, the button's context menu, picking
+// an item and sliding the ZitBlt round its node.
+#include <gtest/gtest.h>
+
+#include <sstream>
+
+#include "QELBaseScrollListZitBltRep.h"
+#include "QELIZitBltMgr.h"
+#include "TempDir.h"
+#include "VORDocument.h"
+#include "VORDriver.h"
+#include "VORModelDoor.h"
+#include "VORScript.h"
+#include "ZitBltTestSupport.h"
+
+namespace {
+
+class ZitBltListScriptTest : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    unsetenv("ScrollListRange");
+    startup.WriteConfig(
+        "<Config><ActivityZitBlt ActivityType=\"BIWActivityStation\">"
+        "<ZitBlt Name=\"ProductInput\" Type=\"QELBaseScrollListZitBltRep\" "
+        "LoadModule=\"QELZitBltVisu\" Location=\"lefttop\" IconFile=\"I_ZitBltProductInput\">"
+        "<UpdateData CmdName=\"QELTestInputListZitBltCmd\" LoadModule=\"QELZitBltTestCmds\"/>"
+        "</ZitBlt>"
+        "<ZitBlt Name=\"Empty\" Type=\"QELBaseScrollListZitBltRep\" LoadModule=\"QELZitBltVisu\" "
+        "Location=\"righttop\" IconFile=\"I_ZitBltProductOutput\"/>"
+        "</ActivityZitBlt></Config>");
+    auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
+    VORModelDoor& door = doc->GetDoor();
+    VORBaseUnknown_var s;
+    door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", s, 0, "S");
+    door.SetLabel(s, VORUnicodeString("S"));
+    for (int i = 1; i <= 7; ++i) {
+      VORBaseUnknown_var part, io;
+      door.CreateProduct(doc->GetRootProduct(), VORUnicodeString("P" + std::to_string(i)), part);
+      door.AddProductIO(s, part, true, io);
+    }
+    std::string error;
+    const std::string file = dir.Path() + "/line.pprx";
+    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
+    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
+    ASSERT_TRUE(driver.PickObject("Line") && driver.StartCommand("QELFpaProductFlowViewerCmd"))
+        << driver.LastError();
+    driver.TakeEvents();
+  }
+  // Runs the steps; the output of the last step only.
+  std::string Run(const std::string& steps, bool ok = true) {
+    std::ostringstream out;
+    VORScript script(driver, out);
+    EXPECT_EQ(script.Run(steps), ok) << out.str();
+    const std::string text = "\n" + out.str();
+    const size_t last = text.rfind("\n> ");
+    return text.substr(text.find('\n', last + 1) + 1);
+  }
+  QELBaseScrollListZitBltRep* List() {
+    QELIZitBltMgr_var manager{VORBaseUnknown_var(driver.FindObject("S"))};
+    QELZitBltRep* rep = nullptr;
+    manager->GetZitBlt("ProductInput", &rep);
+    return rep != nullptr ? rep->GetScrollListRep() : nullptr;
+  }
+
+  ZitBltStartupDir startup;
+  TempDir dir;
+  VORDriver driver;
+};
+
+TEST_F(ZitBltListScriptTest, PrintListDescribesEveryItemWithItsGeometry) {
+  const std::string text = Run("expand S ProductInput\nprint list S ProductInput\n");
+  std::istringstream lines(text);
+  std::string line;
+  std::getline(lines, line);
+  EXPECT_EQ(line, "list \"ProductInput\" of \"S\": 7 items, range 5, first 1, scroll bar shown");
+  std::getline(lines, line);
+  EXPECT_EQ(line,
+            "  item 1 \"P1\": kind 1, state 0, shown, label (-17, 0.5), anchor 3, icon "
+            "\"I_PODShownInputPart\", link (-9, 0.5) (-6.5, 0.5) (-6.5, -2) (-4, -2), arrow "
+            "(-5.90212, -2.61802) (-4, -2) (-5.90212, -1.38198)");
+  int items = 1;
+  while (std::getline(lines, line))
+    ++items;
+  EXPECT_EQ(items, 7);
+  EXPECT_NE(text.find("  item 6 \"P6\": kind 1, state 0, hidden, label (-17, 13)"),
+            std::string::npos);
+  EXPECT_EQ(Run("print list S Empty\n"),
+            "list \"Empty\" of \"S\": 0 items, range 5, first 1, scroll bar none, grey\n");
+}
+
+TEST_F(ZitBltListScriptTest, ExpandAndCollapseAreClicksThatRefuseTheStateAlreadyShown) {
+  Run("expand S ProductInput\n");
+  EXPECT_FALSE(List()->IsButtonCollapse());
+  EXPECT_NE(Run("expand S ProductInput\n", false).find("is already open"), std::string::npos);
+  Run("collapse S ProductInput\n");
+  EXPECT_TRUE(List()->IsButtonCollapse());
+  EXPECT_NE(Run("collapse S ProductInput\n", false).find("is already closed"), std::string::npos);
+  EXPECT_NE(Run("expand S Nothing\n", false).find("has no ZitBlt \"Nothing\""), std::string::npos);
+}
+
+TEST_F(ZitBltListScriptTest, ScrollMovesTheWindowAndClampsLikeAHandDrag) {
+  Run("expand S ProductInput\nscroll S ProductInput 3\n");
+  EXPECT_EQ(List()->GetFirst(), 3);
+  const std::string text = Run("print list S ProductInput\n");
+  EXPECT_NE(text.find("first 3, scroll bar shown"), std::string::npos);
+  EXPECT_NE(text.find("item 1 \"P1\": kind 1, state 0, hidden, label (-17, -4.5)"),
+            std::string::npos);
+  EXPECT_NE(text.find("item 7 \"P7\": kind 1, state 0, shown, label (-17, 10.5)"),
+            std::string::npos);
+  Run("scroll S ProductInput 99\n");
+  EXPECT_EQ(List()->GetFirst(), 3);
+  Run("scroll S ProductInput 0\n");
+  EXPECT_EQ(List()->GetFirst(), 1);
+}
+
+TEST_F(ZitBltListScriptTest, BalloonAndContextMenuOfAListThatScrolls) {
+  Run("expand S ProductInput\n");
+  EXPECT_EQ(Run("balloon S ProductInput\n"), "balloon: Size = 7\n");
+  EXPECT_NE(Run("context-zitblt S ProductInput\nprint menu\n")
+                .find("PushItem \"HideShowScrollBar\" title=\"HideScrollBar\""),
+            std::string::npos);
+  Run("menu HideScrollBar\n");
+  EXPECT_NE(Run("print list S ProductInput\n").find("scroll bar hidden"), std::string::npos);
+  EXPECT_NE(Run("context-zitblt S ProductInput\nprint menu\n").find("title=\"ShowScrollBar\""),
+            std::string::npos);
+  EXPECT_NE(Run("balloon S ProductInput\n", false).find("has no scroll bar"), std::string::npos);
+}
+
+TEST_F(ZitBltListScriptTest, PickItemSelectsItAndItRidesOnTheItemManipulator) {
+  EXPECT_NE(Run("pick-item S ProductInput P2\n", false).find("is closed"), std::string::npos);
+  Run("expand S ProductInput\npick-item S ProductInput P2\n");
+  EXPECT_EQ(driver.GetEditor()->GetCSO()->GetSize(), 1);
+  ASSERT_EQ(List()->GetItemManipulator()->GetElementCount(), 1);
+  EXPECT_NE(Run("pick-item S ProductInput P7\n", false).find("scrolled out of view"),
+            std::string::npos);
+  // A click elsewhere empties the selection: the item leaves the manipulator.
+  driver.GetEditor()->GetCSO()->Empty(1);
+  EXPECT_EQ(List()->GetItemManipulator()->GetElementCount(), 0);
+}
+
+TEST_F(ZitBltListScriptTest, SlidingTheButtonDownTheLeftEdgeTurnsTheListDownwards) {
+  Run("expand S ProductInput\nslide S ProductInput 0 -12\n");
+  EXPECT_EQ(List()->GetLocation(), VORUnicodeString("leftbottom"));
+  EXPECT_NE(Run("print list S ProductInput\n")
+                .find("item 1 \"P1\": kind 1, state 0, shown, "
+                      "label (-17, -4.5)"),
+            std::string::npos);
+}
+
+}  // namespace
