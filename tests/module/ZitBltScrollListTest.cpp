@@ -5,6 +5,9 @@
 
 #include "QELBaseScrollListZitBltRep.h"
 #include "VORDlgContextualMenu.h"
+#include "VORDocument.h"
+#include "VORISPPAbstractActivity.h"
+#include "VORModelDoor.h"
 #include "VORExtIVisu.h"
 #include "ZitBltListVisuTestSupport.h"
 #include "ZitBltTestSupport.h"
@@ -292,6 +295,37 @@ TEST_F(ScrollListTest, SelectedItemsOfThisListRideOnTheItemManipulator) {
       new VORCSOChangeNotification(cso, VORListValVORBaseUnknown_var(), removed));
   rep->OnCSONotif(change);
   EXPECT_EQ(rep->GetItemManipulator()->GetElementCount(), 0);
+}
+
+}  // namespace
+
+namespace {
+
+TEST(ScrollListCycleTimeTest, JoiningActivitiesRecomputeTheirTimeAndOthersAreLeftAlone) {
+  auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
+  VORModelDoor& door = doc->GetDoor();
+  VORBaseUnknown_var weld, arc, station;
+  door.CreateNode(doc->GetRootProcess(), "BIWActivitySpotWelding", weld);
+  door.CreateNode(doc->GetRootProcess(), "BIWActivityArcWelding", arc);
+  door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", station);
+  door.SetUserAttribute(weld, "NumberOfPoints", VORAttributeValue::Long(12));
+  door.SetUserAttribute(weld, "TimePerPoint", VORAttributeValue::Double(2.5));
+  door.SetUserAttribute(arc, "SeamLength", VORAttributeValue::Long(900));
+  door.SetUserAttribute(arc, "SeamSpeed", VORAttributeValue::Double(50));
+  VORISPPAbstractActivity_var(station)->SetActivityTime(7);
+  auto* rep = new QELBaseScrollListZitBltRep(nullptr, 5);
+  for (VORBaseUnknown* activity : {weld.get(), arc.get(), station.get()})
+    rep->UpdateCycleTime(activity);
+  auto time = [](VORBaseUnknown* a) {
+    double t = 0.0;
+    VORISPPAbstractActivity_var(VORBaseUnknown_var(a))->GetActivityTime(t);
+    return t;
+  };
+  EXPECT_EQ(time(weld), 30.0);
+  EXPECT_EQ(time(arc), 18.0);
+  EXPECT_EQ(time(station), 7.0);
+  rep->RequestDelayedDestruction();
+  VORDeferredDeletion::Drain();
 }
 
 }  // namespace

@@ -5,6 +5,8 @@
 #include <cstdio>
 #include <cstdlib>
 
+#include "QELIBIWCurveFasteningActivity.h"
+#include "QELIBIWWeldingActivity.h"
 #include "QELIListZitBltItem.h"
 #include "QELIZitBltCBSubscriber.h"
 #include "QELIZitBltMgr.h"
@@ -678,9 +680,12 @@ void QELBaseScrollListZitBltRep::FinalizePertNodePosition() {
     ReFreshZitBltReps(GetLocation());
 }
 
-void QELBaseScrollListZitBltRep::UpdateCycleTime(VORBaseUnknown*) {
-  // Welding and curve-fastening activities recompute their cycle times on request; the model
-  // offers no such interface yet, so there is nothing to ask.
+void QELBaseScrollListZitBltRep::UpdateCycleTime(VORBaseUnknown* activity) {
+  // Joining activities recompute their time from their joints or seams; others answer neither.
+  if (QELIBIWWeldingActivity_var welding{VORBaseUnknown_var(activity)}; welding)
+    welding->UpdateCycleTime();
+  if (QELIBIWCurveFasteningActivity_var curve{VORBaseUnknown_var(activity)}; curve)
+    curve->UpdateCycleTime();
 }
 
 VORNotifPropagation QELBaseScrollListZitBltRep::AnalyseNotification(VORCommand* from,
