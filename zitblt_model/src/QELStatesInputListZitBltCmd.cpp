@@ -1,0 +1,56 @@
+#include "QELStatesInputListZitBltCmd.h"
+
+#include <unordered_set>
+
+#include "QELBaseScrollListZitBltRep.h"
+#include "QELIBIWItemInfo.h"
+#include "QELListZitBltCmdHelpers.h"
+#include "VORCommandHeader.h"
+#include "VORISPPItem.h"
+#include "VORISPPItemMgt.h"
+
+bool QELStatesInputListZitBltCmd::HandleEvent(SPPModifyKind kind, VORBaseUnknown* son) {
+  if (kind == SPPProductIOChanged)
+    return true;
+  return (kind == SPPItemAssigned || kind == SPPItemUnassigned) &&
+         QELIsItemOfType(son, {"ASMPRODUCT", "QELMfgAssy"});
+}
+
+void QELStatesInputListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep) {
+  if (rep == nullptr)
+    return;
+  rep->RemoveAllItems(1);
+  VORISPPFlowMgt_var flow(GetOwner());
+  if (flow && VORISPPItemMgt_var(GetOwner())) {
+    // The activity's own inputs.
+    VORListValVORBaseUnknown_var assigned;
+    GetFirstFirstAssignedItems(VORISPPActivity_var(GetOwner()), assigned);
+    QELAppendAssignedInputs(flow.get(), assigned, rep, QELIListZitBltItemState::Direct);
+    // What the sub-activities take from outside, once each.
+    if (QELIBIWItemInfo_var info(GetOwner()); info) {
+      VORListValVORBaseUnknown_var* activities = nullptr;
+      VORListValVORBaseUnknown_var* covered = nullptr;
+      info->GetActivityList(activities);
+      info->GetCoveredItems(covered);
+      std::unordered_set<const void*> skip;
+      if (covered != nullptr) {
+        for (const VORBaseUnknown_var& item : *covered)
+          skip.insert(item.Identity());
+      }
+      VORListValVORBaseUnknown_var collected;
+      if (activities != nullptr) {
+        for (const VORBaseUnknown_var& activity : *activities)
+          GetFirstFirstAssignedItems(VORISPPActivity_var(activity), collected);
+      }
+      for (const VORBaseUnknown_var& item : collected) {
+        if (VORISPPItem_var(item) && skip.insert(item.Identity()).second)
+          rep->AppendItem(item.get(), QELIListZitBltItemState::Listed);
+      }
+      delete activities;
+      delete covered;
+    }
+  }
+  rep->DrawScrollList();
+}
+
+VOR_EXPORT_COMMAND_FACTORY(QELStatesInputListZitBltCmd)
