@@ -18,7 +18,7 @@ class QELEZitBltCBSubscriber;
 class QELBaseListZitBltCmd : public VORCommand {
   VOR_DECLARE_CLASS(QELBaseListZitBltCmd, VORCommand)
  public:
-  // owner: the activity whose ZitBlt this command fills (held). Parses the status-bar
+  // owner: the activity whose ZitBlt this command fills (not held). Parses the status-bar
   // configuration file while it has not parsed once in the process.
   explicit QELBaseListZitBltCmd(VORBaseUnknown* owner);
 
@@ -31,7 +31,8 @@ class QELBaseListZitBltCmd : public VORCommand {
   // Fills the list. rep is null for a ZitBlt that shows no list.
   virtual void UpdateList(QELBaseScrollListZitBltRep* rep) = 0;
 
-  VORBaseUnknown_var GetOwner() const { return _owner; }
+  // Null once the owner's subscriber has let the command go.
+  VORBaseUnknown_var GetOwner() const { return VORBaseUnknown_var(_owner); }
   VORUnicodeString GetPODName() const { return _podName; }
   void SetPODName(const VORUnicodeString& name) { _podName = name; }
 
@@ -72,7 +73,9 @@ class QELBaseListZitBltCmd : public VORCommand {
   static void InitializeData();
   void RefreshOwnerAndAncestors();
 
-  VORBaseUnknown_var _owner;
+  // Not held: the owner holds the command (through its subscriber), and a command holding its
+  // owner back would keep every activity with list ZitBlts alive.
+  VORBaseUnknown* _owner;
   int _callbackHandle = -1;
   VORUnicodeString _podName;
   VORHandle<VOREventPublisher> _callbackPublisher;

@@ -61,9 +61,9 @@ bool QELBaseListZitBltCmd::HandleEvent(SPPModifyKind kind, VORBaseUnknown*) {
 }
 
 void QELBaseListZitBltCmd::RefreshOwnerAndAncestors() {
-  if (QELIZitBltMgr_var manager(_owner); manager)
+  if (QELIZitBltMgr_var manager(GetOwner()); manager)
     manager->UpdateZitBlt(_podName);
-  VORISPPActivity_var activity(_owner);
+  VORISPPActivity_var activity(GetOwner());
   VORBaseUnknown_var father;
   if (activity)
     activity->GetFatherActivity(father);
@@ -101,7 +101,7 @@ HRESULT QELBaseListZitBltCmd::GetRootActivity(VORISPPActivity** root) {
   if (root == nullptr)
     return E_FAIL;
   *root = nullptr;
-  VORISPPActivity_var activity(_owner);
+  VORISPPActivity_var activity(GetOwner());
   VORBaseUnknown_var rootObject;
   if (!activity || FAILED(activity->GetRootActivity(rootObject)))
     return E_FAIL;
@@ -160,7 +160,7 @@ void QELBaseListZitBltCmd::EndWithOwner() {
 
 int QELBaseListZitBltCmd::GetAttributeValue(const VORUnicodeString& name) {
   VORAttributeValue value;
-  if (VORIUserAttributes_var attributes(_owner); attributes)
+  if (VORIUserAttributes_var attributes(GetOwner()); attributes)
     attributes->GetAttributeValue(name, value);
   switch (value.type) {
     case VORAttributeLong:
@@ -173,14 +173,14 @@ int QELBaseListZitBltCmd::GetAttributeValue(const VORUnicodeString& name) {
       break;
   }
   // The planning hub's user-defined attribute; there 0 and "no value" both give -1.
-  VORISpecObject_var spec(_owner);
+  VORISpecObject_var spec(GetOwner());
   VORProcess* document = spec ? spec->GetDocument() : nullptr;
   const VORBaseUnknown_var documentObject(document);
   if (!VORIIPDAdapter_var(documentObject))
     return -1;
   VORIIPDAttributeMgt_var hub(documentObject);
   VORAttributeValue hubValue;
-  if (!hub || FAILED(hub->GetUserDefinedAttribute(_owner.get(), name, hubValue)))
+  if (!hub || FAILED(hub->GetUserDefinedAttribute(_owner, name, hubValue)))
     return -1;
   int result = -1;
   if (hubValue.type == VORAttributeLong)

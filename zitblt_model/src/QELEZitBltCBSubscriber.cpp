@@ -28,6 +28,9 @@ void QELEZitBltCBSubscriber::DeleteCommands() {
   for (auto& entry : _commands) {
     entry.second->_holder = QELBaseListZitBltCmd::Holder::Released;
     entry.second->_subscriber = nullptr;
+    // The command is not called any more: it must not reach an activity that may be dying.
+    entry.second->RemoveCallbacks();
+    entry.second->_owner = nullptr;
     VORCommandDeletion(entry.second);
   }
   _commands.clear();
