@@ -57,6 +57,7 @@ TEST(ZitBltDialogWindowTest, TheMenuCommandOpensCheckBoxesThatHideZitBltsAtOnce)
   VORQtDialogWidget* widget = window->Dialogs()->WidgetOf(dialog);
   ASSERT_NE(widget, nullptr);
   EXPECT_TRUE(widget->isVisible());
+  EXPECT_EQ(widget->windowTitle(), "Show/Hide ZitBlts");
   const QList<QCheckBox*> boxes = widget->findChildren<QCheckBox*>();
   QCheckBox* all = BoxTitled(boxes, "All");
   const int names = static_cast<int>(boxes.size()) - (all != nullptr ? 1 : 0);
