@@ -9,7 +9,10 @@
 #include "QELIZitBltMgr.h"
 #include "TempDir.h"
 #include "VORDocument.h"
+#include "QELIPertNode.h"
 #include "VORDriver.h"
+#include "VORExtIVisu.h"
+#include "VORManipulator.h"
 #include "VORModelDoor.h"
 #include "VORScript.h"
 #include "ZitBltTestSupport.h"
@@ -31,9 +34,12 @@ class ZitBltListScriptTest : public ::testing::Test {
         "</ActivityZitBlt></Config>");
     auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
     VORModelDoor& door = doc->GetDoor();
-    VORBaseUnknown_var s;
+    VORBaseUnknown_var s, t;
     door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", s, 0, "S");
     door.SetLabel(s, VORUnicodeString("S"));
+    door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", t, 0, "T");
+    door.SetLabel(t, VORUnicodeString("T"));
+    door.AddFlow(s, t);
     for (int i = 1; i <= 7; ++i) {
       VORBaseUnknown_var part, io;
       door.CreateProduct(doc->GetRootProduct(), VORUnicodeString("P" + std::to_string(i)), part);
@@ -146,6 +152,42 @@ TEST_F(ZitBltListScriptTest, SlidingTheButtonDownTheLeftEdgeTurnsTheListDownward
                 .find("item 1 \"P1\": kind 1, state 0, shown, "
                       "label (-17, -4.5)"),
             std::string::npos);
+}
+
+TEST_F(ZitBltListScriptTest, ASelectedItemDraggedOverAnotherActivityFindsItAndComesBack) {
+  Run("expand S ProductInput\npick-item S ProductInput P2\n");
+  QELBaseScrollListZitBltRep* list = List();
+  ASSERT_EQ(list->GetItemManipulator()->GetElementCount(), 1);
+  auto* item = dynamic_cast<VOR2DBagRep*>(
+      VORIVisu_var(VORBaseUnknown_var(list->GetItemVisual(2)))->GetRep());
+  auto* label = dynamic_cast<VOR2DBagRep*>(item->GetChild(1));
+  // The label's middle in model coordinates: through the item and expanded bags.
+  VOR3x3Matrix toModel = *list->GetZitBltExpanded()->GetMatrix() * *label->GetMatrix();
+  const VORBox2D box = toModel.TransformBox(label->GetChild(1)->GetBoundingBox());
+  double tx = 0, ty = 0;
+  QELIPertNode_var(VORBaseUnknown_var(driver.FindObject("T")))->GetPosition(tx, ty, 1);
+
+  std::vector<VORBaseUnknown*> targets;
+  std::vector<int> cursors;
+  auto watcher = VORCommand_var::Adopt(new VORCommand());
+  watcher->AddCallback(list->GetItemManipulator()->GetEventPublisher(),
+                       VORManipulator::kVORManipulate,
+                       [&](VORBaseUnknown*, VORNotification*, void*) {
+                         targets.push_back(list->GetDropTarget());
+                         cursors.push_back(list->GetViewer()->GetCursor());
+                       });
+  ASSERT_TRUE(driver.Drag("", box.CentreX(), box.CentreY(), tx, ty)) << driver.LastError();
+  ASSERT_FALSE(targets.empty());
+  EXPECT_EQ(targets.back(), driver.FindObject("T")) << "the activity under the pointer";
+  EXPECT_EQ(cursors.back(), 5) << "no drop allowed: items offer no drop yet";
+  EXPECT_EQ(list->GetViewer()->GetCursor(), 25) << "after the drag";
+  EXPECT_EQ(list->GetDropTarget(), nullptr);
+  EXPECT_EQ(driver.GetEditor()->GetCSO()->GetSize(), 0) << "the selection is emptied";
+  EXPECT_NE(Run("print list S ProductInput\n")
+                .find("item 2 \"P2\": kind 1, state 0, shown, "
+                      "label (-17, 3)"),
+            std::string::npos)
+      << "back in its place";
 }
 
 }  // namespace
