@@ -142,6 +142,41 @@ VORProcess_var MakeLineDocument(int n) {
   return doc;
 }
 
+// The same line where every station consumes one part, produces one and uses one resource: each
+// of its three list ZitBlts has one item.
+VORProcess_var MakeEquippedLineDocument(int n) {
+  VORProcess_var doc = MakeLineDocument(n);
+  VORModelDoor& door = doc->GetDoor();
+  VORListValVORBaseUnknown_var* stations = nullptr;
+  VORIGENode_var(doc->GetRootProcess())->GetChildren(stations);
+  int i = 0;
+  for (const VORBaseUnknown_var& station : *stations) {
+    const std::string tag = std::to_string(++i);
+    VORBaseUnknown_var in, out, tool, io;
+    door.CreateProduct(doc->GetRootProduct(), VORUnicodeString("In" + tag), in);
+    door.CreateProduct(doc->GetRootProduct(), VORUnicodeString("Out" + tag), out);
+    door.CreateProduct(doc->GetRootProduct(), VORUnicodeString("Robot" + tag), tool);
+    door.AddProductIO(station, in, true, io);
+    door.AssignItem(station, in, io);
+    door.AddProductIO(station, out, false, io);
+    door.MakeResource(tool, "Robot", "");
+    door.AssignResource(station, tool);
+  }
+  delete stations;
+  return doc;
+}
+
+std::string EquippedLineFile(int n) {
+  const std::string file = "/tmp/pfv-module-bench-equipped-line-" + std::to_string(n) + ".pprx";
+  static std::vector<int> written;
+  if (std::find(written.begin(), written.end(), n) == written.end()) {
+    std::string error;
+    MakeEquippedLineDocument(n)->SaveAs(file, error);
+    written.push_back(n);
+  }
+  return file;
+}
+
 const std::string& LineFile(int n) {
   static std::string file;
   if (file.empty()) {
@@ -207,6 +242,34 @@ void BM_OpenViewer(benchmark::State& state) {
   delete children;
 }
 
+// Opening the viewer on a line whose stations each list one input, one output and one
+// resource: as above, plus every station's ZitBlts built, their list commands created and run,
+// and each list drawn with its item.
+void BM_OpenViewerWithLists(benchmark::State& state) {
+  VORDriver driver;
+  if (!driver.OpenDocument(EquippedLineFile(static_cast<int>(state.range(0))))) {
+    state.SkipWithError(driver.LastError().c_str());
+    return;
+  }
+  VORProcess* doc = driver.GetDocument();
+  VORListValVORBaseUnknown_var* children = nullptr;
+  VORIGENode_var(doc->GetRootProcess())->GetChildren(children);
+  driver.PickObject("Line");
+  for (auto _ : state) {
+    if (!driver.StartCommand("QELFpaProductFlowViewerCmd") || FindViewer() == nullptr) {
+      state.SkipWithError(driver.LastError().c_str());
+      break;
+    }
+    state.PauseTiming();
+    FindViewer()->DeleteWindow();
+    driver.DrainDeferred();
+    for (VORBaseUnknown_var& child : *children)
+      doc->GetDoor().SetPertPosition(child, false, 0.0, 0.0);
+    state.ResumeTiming();
+  }
+  delete children;
+}
+
 }  // namespace
 
 BENCHMARK(BM_OrganiserComputation)
@@ -221,5 +284,10 @@ BENCHMARK(BM_PlainLongestPathLayering)
     ->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_ArrangeNodesWithRefresh)->Arg(10000)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_OpenViewer)->Arg(10000)->Unit(benchmark::kMillisecond)->Iterations(5);
+BENCHMARK(BM_OpenViewerWithLists)
+    ->Arg(1000)
+    ->Arg(2000)
+    ->Unit(benchmark::kMillisecond)
+    ->Iterations(5);
 
 BENCHMARK_MAIN();
