@@ -81,12 +81,55 @@ TEST(FileIOTest, FailedSaveLeavesTheOldFileByteIdentical) {
   EXPECT_NE(error.find("no/such/dir"), std::string::npos);
 }
 
-TEST(FileIOTest, StrayTemporaryFilesAreCleanedAtStartUp) {
+// A process id that certainly belongs to no running process: a child that has been reaped.
+pid_t DeadProcessId() {
+  pid_t child = ::fork();
+  if (child == 0)
+    ::_exit(0);
+  ::waitpid(child, nullptr, 0);
+  return child;
+}
+
+TEST(FileIOTest, OnlyTemporaryFilesOfDeadProcessesAreRemoved) {
   TempDir dir;
-  dir.Write("line.pprx.vortmp.1234", "torn");
+  const std::string dead = "line.pprx.vortmp." + std::to_string(DeadProcessId());
+  const std::string alive = "line.pprx.vortmp." + std::to_string(::getppid());
+  dir.Write(dead, "torn");
+  dir.Write(alive, "another program is saving");
   dir.Write("line.pprx", "good");
+  dir.Write("notes.vortmp.txt", "not ours");
   EXPECT_EQ(VORRemoveStrayTemporaryFiles(dir.Path()), 1);
+  EXPECT_FALSE(std::filesystem::exists(dir.Path() + "/" + dead));
+  EXPECT_EQ(Read(dir.Path() + "/" + alive), "another program is saving");
+  EXPECT_EQ(Read(dir.Path() + "/notes.vortmp.txt"), "not ours");
   EXPECT_EQ(Read(dir.Path() + "/line.pprx"), "good");
+}
+
+TEST(FileIOTest, SavingThroughASymbolicLinkReplacesItsTargetAndKeepsTheLink) {
+  TempDir dir;
+  const std::string real = dir.Write("store/line.pprx", "version 1");
+  const std::string link = dir.Path() + "/line.pprx";
+  ASSERT_EQ(::symlink("store/line.pprx", link.c_str()), 0);
+  const std::string chain = dir.Path() + "/chain.pprx";
+  ASSERT_EQ(::symlink(link.c_str(), chain.c_str()), 0);
+  std::string error;
+  ASSERT_TRUE(VORWriteFileAtomically(chain, "version 2", error)) << error;
+  EXPECT_TRUE(std::filesystem::is_symlink(link));
+  EXPECT_TRUE(std::filesystem::is_symlink(chain));
+  EXPECT_EQ(Read(real), "version 2");
+  EXPECT_EQ(Read(real + ".bak"), "version 1");
+  EXPECT_FALSE(std::filesystem::exists(link + ".bak"));
+  // A link to a file not yet there creates it.
+  const std::string dangling = dir.Path() + "/new.pprx";
+  ASSERT_EQ(::symlink("store/new.pprx", dangling.c_str()), 0);
+  ASSERT_TRUE(VORWriteFileAtomically(dangling, "fresh", error)) << error;
+  EXPECT_TRUE(std::filesystem::is_symlink(dangling));
+  EXPECT_EQ(Read(dir.Path() + "/store/new.pprx"), "fresh");
+  // A loop of links is refused, naming the path.
+  const std::string loop = dir.Path() + "/loop";
+  ASSERT_EQ(::symlink("loop", loop.c_str()), 0);
+  EXPECT_FALSE(VORWriteFileAtomically(loop, "x", error));
+  EXPECT_NE(error.find(loop), std::string::npos) << error;
 }
 
 }  // namespace

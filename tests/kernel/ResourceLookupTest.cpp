@@ -96,4 +96,25 @@ TEST(SettingRepositoryTest, AbsentKeysLeaveValuesAloneAndSavedValuesComeBack) {
   VORSettingRepository::Forget();
 }
 
+TEST(SettingRepositoryTest, KeysThatCouldNotBeReadBackAreRefused) {
+  TempDir home;
+  setenv("VOR_USER_SETTINGS_DIR", home.Path().c_str(), 1);
+  VORSettingRepository::Forget();
+  VORSettingRepository* repo = VORSettingRepository::GetRepository("Keys");
+  for (const char* key : {"#comment", "a=b", "two\nlines", ""})
+    repo->WriteSetting(key, VORUnicodeString("lost"));
+  repo->WriteSetting(" kept#", VORUnicodeString("value"));
+  VORUnicodeString value;
+  for (const char* key : {"#comment", "a=b", "two\nlines", ""})
+    EXPECT_EQ(repo->ReadSetting(key, value), E_FAIL) << "refused at once: " << key;
+  ASSERT_EQ(repo->SaveRepository(), S_OK);
+  VORSettingRepository::Forget();
+  repo = VORSettingRepository::GetRepository("Keys");
+  for (const char* key : {"#comment", "a=b", "two\nlines", ""})
+    EXPECT_EQ(repo->ReadSetting(key, value), E_FAIL) << key;
+  EXPECT_EQ(repo->ReadSetting(" kept#", value), S_OK);
+  EXPECT_EQ(value, VORUnicodeString("value"));
+  VORSettingRepository::Forget();
+}
+
 }  // namespace

@@ -11,9 +11,11 @@
 bool VORReadFile(const std::string& path, std::string& content, std::string& error,
                  std::size_t maxBytes = std::size_t{256} << 20);
 
-// False with a reason in error (the target then is byte-identical to before).
+// False with a reason in error (the target then is byte-identical to before). A symbolic link is
+// followed: the file it ends at is replaced and the links stay.
 bool VORWriteFileAtomically(const std::string& path, const std::string& content, std::string& error,
                             bool keepBackup = true);
 
-// Removes temporary files a crashed save left in dir; returns how many.
+// Removes temporary files that saves of processes no longer running left in dir (a save in
+// progress elsewhere keeps its own); returns how many.
 int VORRemoveStrayTemporaryFiles(const std::string& dir);

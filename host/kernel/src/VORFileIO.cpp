@@ -5,6 +5,8 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <climits>
+#include <csignal>
 #include <cerrno>
 #include <cstring>
 #include <string_view>
@@ -20,6 +22,32 @@ std::string DirectoryOf(const std::string& path) {
   if (slash == std::string::npos)
     return ".";
   return slash == 0 ? "/" : path.substr(0, slash);
+}
+// The file a chain of symbolic links ends at (which need not exist yet), so that a save replaces
+// the real document beside its backup and keeps the links. False when the chain loops.
+bool FollowLinks(std::string& path) {
+  for (int hops = 0; hops < 40; ++hops) {
+    struct stat st {};
+    if (::lstat(path.c_str(), &st) != 0 || !S_ISLNK(st.st_mode))
+      return true;
+    std::string target(PATH_MAX, '\0');
+    const ssize_t n = ::readlink(path.c_str(), target.data(), target.size());
+    if (n < 0)
+      return false;
+    target.resize(static_cast<size_t>(n));
+    path = target.front() == '/' ? target : DirectoryOf(path) + "/" + target;
+  }
+  errno = ELOOP;
+  return false;
+}
+// A temporary file name ends with the saving process's id.
+bool OwnerIsGone(std::string_view name) {
+  const auto at = name.rfind(kTempMarker);
+  const std::string_view digits = name.substr(at + kTempMarker.size());
+  if (digits.empty() || digits.size() > 9 || digits.find_first_not_of("0123456789") != digits.npos)
+    return false;  // not one of ours
+  const pid_t pid = static_cast<pid_t>(std::stol(std::string(digits)));
+  return pid != ::getpid() && ::kill(pid, 0) != 0 && errno == ESRCH;
 }
 bool WriteAll(int fd, const std::string& content) {
   size_t done = 0;
@@ -75,9 +103,15 @@ bool VORReadFile(const std::string& path, std::string& content, std::string& err
   return true;
 }
 
-bool VORWriteFileAtomically(const std::string& path, const std::string& content, std::string& error,
-                            bool keepBackup) {
+bool VORWriteFileAtomically(const std::string& named, const std::string& content,
+                            std::string& error, bool keepBackup) {
+  std::string path = named;
+  if (!FollowLinks(path)) {
+    error = Reason("cannot follow the links of", named);
+    return false;
+  }
   const std::string dir = DirectoryOf(path);
+  VORRemoveStrayTemporaryFiles(dir);
   const std::string temp = path + std::string(kTempMarker) + std::to_string(::getpid());
   int fd = ::open(temp.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0644);
   if (fd < 0) {
@@ -98,10 +132,15 @@ bool VORWriteFileAtomically(const std::string& path, const std::string& content,
   if (keepBackup && ::access(path.c_str(), F_OK) == 0) {
     // A hard link keeps the old version under the backup name without a window where the
     // target is missing.
+    // Linked under a temporary name first, then renamed: a kill at any moment leaves either the
+    // previous backup or the new one, never none.
     const std::string backup = path + ".bak";
-    ::unlink(backup.c_str());
-    if (::link(path.c_str(), backup.c_str()) != 0) {
+    const std::string backupTemp = backup + std::string(kTempMarker) + std::to_string(::getpid());
+    ::unlink(backupTemp.c_str());
+    if (::link(path.c_str(), backupTemp.c_str()) != 0 ||
+        ::rename(backupTemp.c_str(), backup.c_str()) != 0) {
       error = Reason("cannot keep backup", backup);
+      ::unlink(backupTemp.c_str());
       ::unlink(temp.c_str());
       return false;
     }
@@ -125,7 +164,7 @@ int VORRemoveStrayTemporaryFiles(const std::string& dir) {
   int removed = 0;
   while (dirent* e = ::readdir(d)) {
     std::string_view name(e->d_name);
-    if (name.find(kTempMarker) != std::string_view::npos) {
+    if (name.find(kTempMarker) != std::string_view::npos && OwnerIsGone(name)) {
       if (::unlink((dir + "/" + std::string(name)).c_str()) == 0)
         ++removed;
     }

@@ -119,7 +119,8 @@ HRESULT VORSettingRepository::ReadSetting(const char* key, int& value) const {
 
 void VORSettingRepository::WriteSetting(const char* key, const VORUnicodeString& value) {
   std::string k = key ? key : "";
-  if (k.empty() || k.find_first_of("=\n") != std::string::npos)
+  // Keys the file could not give back are refused: '=' ends a key, '#' starts a comment line.
+  if (k.empty() || k.find_first_of("=\n") != std::string::npos || k[0] == '#')
     return;
   _values[k] = value.ConvertToUTF8();
 }

@@ -30,6 +30,8 @@ struct ParseLimits {
   std::size_t maxFileBytes = std::size_t{64} << 20;
   std::size_t maxMemoryBytes = std::size_t{256} << 20;
   int maxDepth = 512;
+  // Attributes of one element; checked on the raw text, before the parser builds any of them.
+  int maxAttributes = 1024;
   // Called now and then during the parse with the share of the content read so far (0..1).
   std::function<void(double)> progress;
 };
@@ -59,6 +61,12 @@ Document ParseMemory(const std::string& content, const std::string& name, std::s
                      const ParseLimits& limits = {});
 // Reads path itself (regular file, size cap) then parses.
 Document ParseFile(const std::string& path, std::string& error, const ParseLimits& limits = {});
+
+// Checks the raw text before any parser sees it: no NUL byte, no DOCTYPE, no element with more
+// than limits.maxAttributes attributes, no nesting deeper than limits.maxDepth. False with
+// error = "<name>:<line>:<column>: <what is wrong>".
+bool CheckRawText(const std::string& content, const std::string& name, std::string& error,
+                  const ParseLimits& limits);
 
 // UTF-16 parser text <-> UTF-8.
 std::string ToUTF8(const XMLCh* text);

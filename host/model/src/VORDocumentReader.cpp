@@ -1,9 +1,11 @@
-// Reading .pprx documents with the DOM. Loading builds a complete new document or nothing.
-#include <xercesc/dom/DOM.hpp>
-#include <xercesc/util/XMLUni.hpp>
+// Reading .pprx documents: the streaming parser builds a compact tree, the loader builds the
+// model from it. Loading builds a complete new document or nothing.
+#include <climits>
+#include <cstdlib>
 
 #include <algorithm>
 #include <charconv>
+#include <cmath>
 #include <cstring>
 #include <functional>
 #include <stdexcept>
@@ -14,12 +16,9 @@
 #include "VORLateTypes.h"
 #include "VORModelObjects.h"
 #include "VORDocumentFormat.h"
-#include "VORXercesPlatform.h"
-
-using namespace xercesc;
+#include "VORXmlTree.h"
 
 using VORDocumentFormat::kVersion;
-using VORDocumentFormat::Names;
 
 namespace {
 
@@ -30,92 +29,99 @@ class LoadError : public std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
+using Node = VORXmlTree::Index;
+constexpr Node kNone = VORXmlTree::kNone;
+
 class Loader {
  public:
-  Loader(const VORXercesPlatform::Document& dom, std::string name, VORDocumentData& data)
-      : _dom(dom), _name(std::move(name)), _data(data) {}
+  Loader(const VORXmlTree& tree, std::string name, VORDocumentData& data)
+      : _t(tree), _name(std::move(name)), _data(data) {}
 
   void Load() {
-    DOMElement* top = _dom.get()->getDocumentElement();
+    const Node top = _t.Root();
     if (Tag(top) != "pprDocument")
       Fail(top, "the document element is <" + Tag(top) + ">, expected <pprDocument>");
     const std::string version = Attr(top, "version");
     if (version != kVersion)
       Fail(top, "unsupported document version '" + version + "'");
     _data.environment = Attr(top, "environment");
-    DOMElement *products = nullptr, *assemblies = nullptr, *process = nullptr, *planning = nullptr;
-    for (DOMElement* e = top->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+    Node products = kNone, assemblies = kNone, process = kNone, planning = kNone;
+    for (Node e = _t.FirstChild(top); e != kNone; e = _t.Next(e)) {
       const std::string tag = Tag(e);
-      DOMElement** slot = tag == "products"     ? &products
-                          : tag == "assemblies" ? &assemblies
-                          : tag == "process"    ? &process
-                          : tag == "planning"   ? &planning
-                                                : nullptr;
+      Node* slot = tag == "products"     ? &products
+                   : tag == "assemblies" ? &assemblies
+                   : tag == "process"    ? &process
+                   : tag == "planning"   ? &planning
+                                         : nullptr;
       if (slot == nullptr)
         Fail(e, "unexpected element <" + tag + "> in <pprDocument>");
-      if (*slot != nullptr)
+      if (*slot != kNone)
         Fail(e, "a second <" + tag + "> element");
       *slot = e;
     }
-    if (process == nullptr)
+    if (process == kNone)
       Fail(top, "the document has no <process>");
-    if (planning)
+    if (planning != kNone)
       LoadPlanTypes(planning);
-    if (products)
+    if (products != kNone)
       LoadProducts(products);
-    if (assemblies)
+    if (assemblies != kNone)
       LoadAssemblies(assemblies);
     LoadProcess(process);
-    if (planning)
+    if (planning != kNone)
       LoadHubRecords(planning);
   }
 
  private:
-  [[noreturn]] void Fail(const DOMElement* e, const std::string& message) {
+  [[noreturn]] void Fail(Node e, const std::string& message) {
     long line = 0, column = 0;
-    if (e && _dom.ElementPosition(e, line, column))
-      throw LoadError(_name + ":" + std::to_string(line) + ":" + std::to_string(column) + ": " +
-                      message);
-    throw LoadError(_name + ": " + message);
+    _t.Position(e, line, column);
+    throw LoadError(_name + ":" + std::to_string(line) + ":" + std::to_string(column) + ": " +
+                    message);
   }
 
-  std::string Tag(const DOMElement* e) { return VORXercesPlatform::ToUTF8(e->getTagName()); }
-  bool IsTag(const DOMElement* e, const char* tag) {
-    return XMLString::equals(e->getTagName(), _names(tag));
-  }
-  std::string Attr(const DOMElement* e, const char* name) {
-    return VORXercesPlatform::ToUTF8(e->getAttribute(_names(name)));
+  std::string Tag(Node e) { return std::string(_t.Name(e)); }
+  bool IsTag(Node e, const char* tag) { return _t.Name(e) == tag; }
+  std::string Attr(Node e, const char* name) {
+    const std::string_view* v = _t.Find(e, name);
+    return v ? std::string(*v) : std::string();
   }
   // Attribute straight to the model's string type.
-  VORUnicodeString Text(const DOMElement* e, const char* name) {
-    return VORUnicodeString::FromUTF16(
-        reinterpret_cast<const char16_t*>(e->getAttribute(_names(name))));
-  }
-  bool Has(const DOMElement* e, const char* name) {
-    return e->getAttributeNode(_names(name)) != nullptr;
-  }
-  std::string Required(const DOMElement* e, const char* name) {
+  VORUnicodeString Text(Node e, const char* name) { return VORUnicodeString(Attr(e, name)); }
+  bool Has(Node e, const char* name) { return _t.Find(e, name) != nullptr; }
+  std::string Required(Node e, const char* name) {
     if (!Has(e, name))
       Fail(e, "<" + Tag(e) + "> without the attribute '" + name + "'");
     return Attr(e, name);
   }
-  double Double(const DOMElement* e, const char* name, double fallback, const std::string& id) {
-    if (!Has(e, name))
-      return fallback;
-    const std::string text = Attr(e, name);
+  // A finite number; the place and the text in the message otherwise.
+  double Finite(Node e, const std::string& text, const std::string& what) {
     double v = 0;
     auto r = std::from_chars(text.data(), text.data() + text.size(), v);
-    if (text.empty() || r.ec != std::errc() || r.ptr != text.data() + text.size())
-      Fail(e, "'" + id + "': attribute '" + name + "' is not a number: '" + text + "'");
+    if (text.empty() || r.ptr != text.data() + text.size() ||
+        (r.ec != std::errc() && r.ec != std::errc::result_out_of_range))
+      Fail(e, what + " is not a number: '" + text + "'");
+    if (r.ec != std::errc() || !std::isfinite(v))
+      Fail(e, what + " is not a finite number: '" + text + "'");
     return v;
   }
-  long Long(const DOMElement* e, const char* name, long fallback, const std::string& id) {
+  double Double(Node e, const char* name, double fallback, const std::string& id) {
+    if (!Has(e, name))
+      return fallback;
+    return Finite(e, Attr(e, name), "'" + id + "': attribute '" + name + "'");
+  }
+  double Size(Node e, const char* name, const std::string& id) {
+    const double v = Double(e, name, 0, id);
+    if (v < 0)
+      Fail(e, "'" + id + "': attribute '" + name + "' is negative: '" + Attr(e, name) + "'");
+    return v;
+  }
+  long Long(Node e, const char* name, long fallback, const std::string& id) {
     if (!Has(e, name))
       return fallback;
     return ParseLong(e, Attr(e, name), name, id);
   }
-  long ParseLong(const DOMElement* e, const std::string& text, const char* name,
-                 const std::string& id) {
+  long ParseLong(Node e, const std::string& text, const char* name, const std::string& id) {
     long v = 0;
     auto r = std::from_chars(text.data(), text.data() + text.size(), v);
     if (text.empty() || r.ec != std::errc() || r.ptr != text.data() + text.size())
@@ -123,7 +129,7 @@ class Loader {
     return v;
   }
 
-  std::string NewId(const DOMElement* e) {
+  std::string NewId(Node e) {
     std::string id = Required(e, "id");
     if (id.empty())
       Fail(e, "<" + Tag(e) + "> with an empty id");
@@ -137,7 +143,7 @@ class Loader {
     _data.ids[id] = o;
   }
   template <class T>
-  T* Ref(const DOMElement* e, const char* attribute, const char* what) {
+  T* Ref(Node e, const char* attribute, const char* what) {
     const std::string id = Required(e, attribute);
     VORModelObject* o = _data.Find(id);
     if (o == nullptr)
@@ -147,7 +153,7 @@ class Loader {
       Fail(e, "'" + id + "' is not " + what);
     return t;
   }
-  VORModelObject* ItemRef(const DOMElement* e, const char* attribute) {
+  VORModelObject* ItemRef(Node e, const char* attribute) {
     const std::string id = Required(e, attribute);
     VORModelObject* o = _data.Find(id);
     if (o == nullptr)
@@ -161,25 +167,20 @@ class Loader {
     s->out.push_back({t, type, via});
     t->in.push_back(s);
   }
-  void ExpectOnly(const DOMElement* e, std::initializer_list<const char*> tags) {
-    for (DOMElement* c = e->getFirstElementChild(); c; c = c->getNextElementSibling()) {
+  void ExpectOnly(Node e, std::initializer_list<const char*> tags) {
+    for (Node c = _t.FirstChild(e); c != kNone; c = _t.Next(c)) {
       if (std::none_of(tags.begin(), tags.end(), [&](const char* t) { return IsTag(c, t); }))
         Fail(c, "unexpected element <" + Tag(c) + "> in <" + Tag(e) + ">");
     }
   }
 
-  VORAttributeValue TypedValue(const DOMElement* e, const std::string& owner) {
+  VORAttributeValue TypedValue(Node e, const std::string& owner) {
     const std::string type = Required(e, "type");
     const std::string text = Required(e, "value");
     if (type == "long")
       return VORAttributeValue::Long(ParseLong(e, text, "value", owner));
-    if (type == "double") {
-      double v = 0;
-      auto r = std::from_chars(text.data(), text.data() + text.size(), v);
-      if (text.empty() || r.ec != std::errc() || r.ptr != text.data() + text.size())
-        Fail(e, "'" + owner + "': value '" + text + "' is not a double");
-      return VORAttributeValue::Double(v);
-    }
+    if (type == "double")
+      return VORAttributeValue::Double(Finite(e, text, "'" + owner + "': value '" + text + "'"));
     if (type == "string")
       return VORAttributeValue::String(VORUnicodeString(text));
     Fail(e, "'" + owner + "': unknown value type '" + type + "'");
@@ -187,16 +188,16 @@ class Loader {
 
   // -------- planning
 
-  void LoadPlanTypes(DOMElement* planning) {
+  void LoadPlanTypes(Node planning) {
     ExpectOnly(planning, {"planType", "hubRecord"});
-    std::vector<std::pair<DOMElement*, VORPlanTypeImpl*>> types;
-    for (DOMElement* e = planning->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+    std::vector<std::pair<Node, VORPlanTypeImpl*>> types;
+    for (Node e = _t.FirstChild(planning); e != kNone; e = _t.Next(e)) {
       if (Tag(e) != "planType")
         continue;
       ExpectOnly(e, {"attribute", "relation"});
       auto t = VORHandle<VORPlanTypeImpl>::Adopt(new VORPlanTypeImpl());
       Register(t.get(), NewId(e));
-      for (DOMElement* a = e->getFirstElementChild(); a; a = a->getNextElementSibling()) {
+      for (Node a = _t.FirstChild(e); a != kNone; a = _t.Next(a)) {
         if (Tag(a) == "attribute")
           t->attributes[{Attr(a, "key"), Required(a, "name")}] = VORUnicodeString(Attr(a, "value"));
       }
@@ -208,7 +209,7 @@ class Loader {
     for (auto& [e, t] : types) {
       if (Has(e, "base"))
         Link(t, Ref<VORPlanTypeImpl>(e, "base", "a plan type"), VORPlanTypeImpl::BaseLink);
-      for (DOMElement* r = e->getFirstElementChild(); r; r = r->getNextElementSibling()) {
+      for (Node r = _t.FirstChild(e); r != kNone; r = _t.Next(r)) {
         if (Tag(r) != "relation")
           continue;
         const std::string rel = Required(r, "name");
@@ -218,16 +219,18 @@ class Loader {
       }
     }
     for (auto& [e, t] : types) {
+      if (t->Base() == t)
+        Fail(e, "plan type '" + t->id + "' is its own base");
       std::unordered_set<VORPlanTypeImpl*> seen;
       for (VORPlanTypeImpl* p = t; p != nullptr; p = p->Base()) {
         if (!seen.insert(p).second)
-          Fail(e, "plan type '" + t->id + "' is its own base");
+          Fail(e, "the bases of plan type '" + t->id + "' form a cycle through '" + p->id + "'");
       }
     }
   }
 
-  void LoadHubRecords(DOMElement* planning) {
-    for (DOMElement* e = planning->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+  void LoadHubRecords(Node planning) {
+    for (Node e = _t.FirstChild(planning); e != kNone; e = _t.Next(e)) {
       if (Tag(e) != "hubRecord")
         continue;
       ExpectOnly(e, {"attribute"});
@@ -238,7 +241,7 @@ class Loader {
         Fail(e, "a second hub record of '" + id + "'");
       auto h = VORHandle<VORHubObjectImpl>::Adopt(new VORHubObjectImpl());
       h->objectId = id;
-      for (DOMElement* a = e->getFirstElementChild(); a; a = a->getNextElementSibling())
+      for (Node a = _t.FirstChild(e); a != kNone; a = _t.Next(a))
         h->attributes[Required(a, "name")] = TypedValue(a, id);
       _data.hubObjects.emplace(id, h);
     }
@@ -246,10 +249,10 @@ class Loader {
 
   // -------- products
 
-  void LoadProducts(DOMElement* products) {
+  void LoadProducts(Node products) {
     ExpectOnly(products, {"product"});
-    std::vector<std::pair<DOMElement*, VORProductImpl*>> all;
-    for (DOMElement* e = products->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+    std::vector<std::pair<Node, VORProductImpl*>> all;
+    for (Node e = _t.FirstChild(products); e != kNone; e = _t.Next(e)) {
       auto p = VORHandle<VORProductImpl>::Adopt(new VORProductImpl());
       Register(p.get(), NewId(e));
       p->partNumber = Text(e, "name");
@@ -303,10 +306,10 @@ class Loader {
 
   // -------- assemblies
 
-  void LoadAssemblies(DOMElement* assemblies) {
+  void LoadAssemblies(Node assemblies) {
     ExpectOnly(assemblies, {"assembly"});
-    std::vector<std::pair<DOMElement*, VORMfgAssemblyImpl*>> all;
-    for (DOMElement* e = assemblies->getFirstElementChild(); e; e = e->getNextElementSibling()) {
+    std::vector<std::pair<Node, VORMfgAssemblyImpl*>> all;
+    for (Node e = _t.FirstChild(assemblies); e != kNone; e = _t.Next(e)) {
       ExpectOnly(e, {"component"});
       auto m = VORHandle<VORMfgAssemblyImpl>::Adopt(new VORMfgAssemblyImpl());
       Register(m.get(), NewId(e));
@@ -315,7 +318,7 @@ class Loader {
       all.push_back({e, m.get()});
     }
     for (auto& [e, m] : all) {
-      for (DOMElement* c = e->getFirstElementChild(); c; c = c->getNextElementSibling()) {
+      for (Node c = _t.FirstChild(e); c != kNone; c = _t.Next(c)) {
         VORModelObject* item = ItemRef(c, "ref");
         if (m->FindLink(item, VORILinkableObject::ComponentLink))
           Fail(c, "assembly '" + m->id + "' lists '" + item->id + "' twice");
@@ -343,10 +346,10 @@ class Loader {
 
   // -------- process
 
-  void LoadProcess(DOMElement* process) {
+  void LoadProcess(Node process) {
     ExpectOnly(process, {"activity"});
-    DOMElement* e = process->getFirstElementChild();
-    if (e == nullptr || e->getNextElementSibling() != nullptr)
+    Node e = _t.FirstChild(process);
+    if (e == kNone || _t.Next(e) != kNone)
       Fail(process, "<process> must hold exactly one root activity");
     if (Attr(e, "type") != VORModelLateTypes::Root)
       Fail(e, "the root activity must be of type 'BIWActivityRoot', not '" + Attr(e, "type") + "'");
@@ -356,7 +359,7 @@ class Loader {
     LoadNodeBody(e, root.get());
   }
 
-  VORGraphNodeImpl* MakeNode(DOMElement* e) {
+  VORGraphNodeImpl* MakeNode(Node e) {
     const std::string type = Required(e, "type");
     VORGraphNodeImpl* node = nullptr;
     if (IsTag(e, "activity")) {
@@ -377,7 +380,7 @@ class Loader {
   }
 
   // <zitblt name="..." shown="0|1"/>: the visibility a planner chose for one ZitBlt.
-  void LoadZitBltShown(DOMElement* c, VORActivityImpl* a) {
+  void LoadZitBltShown(Node c, VORActivityImpl* a) {
     const std::string name = Required(c, "name");
     const long shown = Long(c, "shown", 1, a->id);
     if (name.empty() || a->zitBltShown.count(name))
@@ -387,7 +390,7 @@ class Loader {
     a->zitBltShown[name] = shown == 1;
   }
 
-  void LoadNodeBody(DOMElement* e, VORGraphNodeImpl* node) {
+  void LoadNodeBody(Node e, VORGraphNodeImpl* node) {
     const std::string& id = node->id;
     node->label = Text(e, "label");
     if (Has(e, "x") || Has(e, "y")) {
@@ -395,15 +398,17 @@ class Loader {
       node->x = Double(e, "x", 0, id);
       node->y = Double(e, "y", 0, id);
     }
-    node->state = static_cast<int>(Long(e, "state", 0, id));
-    if (node->state < 0 || node->state > 2)
-      Fail(e, "'" + id + "': node state " + std::to_string(node->state) + " is not 0, 1 or 2");
-    node->width = Double(e, "width", 0, id);
-    node->height = Double(e, "height", 0, id);
+    // The range is checked on the wide value: narrowing first would wrap 2^32 + 2 to 2.
+    const long state = Long(e, "state", 0, id);
+    if (state < 0 || state > 2)
+      Fail(e, "'" + id + "': node state " + std::to_string(state) + " is not 0, 1 or 2");
+    node->state = static_cast<int>(state);
+    node->width = Size(e, "width", id);
+    node->height = Size(e, "height", id);
     VORActivityImpl* a = node->AsActivity();
     if (a == nullptr) {
-      if (e->getFirstElementChild() != nullptr)
-        Fail(e->getFirstElementChild(), "control node '" + id + "' cannot hold elements");
+      if (_t.FirstChild(e) != kNone)
+        Fail(_t.FirstChild(e), "control node '" + id + "' cannot hold elements");
       return;
     }
     a->time = Double(e, "time", 0, id);
@@ -412,8 +417,8 @@ class Loader {
         Fail(e, "'" + id + "': only stations have a cycle time");
       a->stationCycleTime = Double(e, "cycleTime", 0, id);
     }
-    std::vector<DOMElement*> flows;
-    for (DOMElement* c = e->getFirstElementChild(); c; c = c->getNextElementSibling()) {
+    std::vector<Node> flows;
+    for (Node c = _t.FirstChild(e); c != kNone; c = _t.Next(c)) {
       if (IsTag(c, "activity") || IsTag(c, "node")) {
         auto child = VORHandle<VORGraphNodeImpl>::Adopt(MakeNode(c));
         Register(child.get(), NewId(c));
@@ -457,7 +462,7 @@ class Loader {
         Fail(c, "unexpected element <" + Tag(c) + "> in activity '" + id + "'");
       }
     }
-    for (DOMElement* f : flows) {
+    for (Node f : flows) {
       const std::string from = Required(f, "from"), to = Required(f, "to");
       auto* a1 = VORKindCast<VORGraphNodeImpl>(_data.Find(from));
       auto* a2 = VORKindCast<VORGraphNodeImpl>(_data.Find(to));
@@ -479,10 +484,9 @@ class Loader {
     }
   }
 
-  const VORXercesPlatform::Document& _dom;
+  const VORXmlTree& _t;
   std::string _name;
   VORDocumentData& _data;
-  Names _names;
   std::vector<VORHandle<VORModelObject>> _keep;  // products until the tree owns them
 };
 
@@ -511,18 +515,20 @@ VORProcess* VORProcess::LoadFromString(const std::string& xml, const std::string
   if (LoadProgress())
     limits.progress = [](double share) { Report(static_cast<int>(share * 60.0)); };
   Report(0);
-  VORXercesPlatform::Document dom = VORXercesPlatform::ParseMemory(xml, name, error, limits);
-  if (!dom)
-    return nullptr;
-  Report(60);
   auto doc = VORHandle<VORProcess>::Adopt(new VORProcess());
-  doc->_data->ids.reserve(xml.size() / 120);
-  try {
-    Loader loader(dom, name, *doc->_data);
-    loader.Load();
-  } catch (const LoadError& e) {
-    error = e.what();
-    return nullptr;
+  {
+    VORXmlTree tree;
+    if (!tree.Parse(xml, name, error, limits))
+      return nullptr;
+    Report(60);
+    doc->_data->ids.reserve(tree.Size() / 2);
+    try {
+      Loader loader(tree, name, *doc->_data);
+      loader.Load();
+    } catch (const LoadError& e) {
+      error = e.what();
+      return nullptr;
+    }
   }
   Report(90);
   std::vector<std::string> problems;
@@ -541,6 +547,10 @@ VORProcess* VORProcess::Load(const std::string& path, std::string& error) {
   std::string content;
   if (!VORReadFile(path, content, error, std::size_t{64} << 20))
     return nullptr;
+  // What a killed save left beside the document goes as soon as the document is opened.
+  char real[PATH_MAX];
+  const std::string file = ::realpath(path.c_str(), real) ? std::string(real) : path;
+  VORRemoveStrayTemporaryFiles(file.substr(0, file.rfind('/') + (file.rfind('/') == 0)));
   VORProcess* doc = LoadFromString(content, path, error);
   if (doc != nullptr)
     doc->SetStorageName(path);

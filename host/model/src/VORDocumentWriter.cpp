@@ -251,8 +251,6 @@ bool VORProcess::SaveAs(const std::string& path, std::string& error) {
     error = path + ": the document could not be written as XML";
     return false;
   }
-  const auto slash = path.rfind('/');
-  VORRemoveStrayTemporaryFiles(slash == std::string::npos ? "." : path.substr(0, slash));
   if (!VORWriteFileAtomically(path, content, error, true))
     return false;
   SetStorageName(path);

@@ -20,6 +20,7 @@
 
 #include "VORFileIO.h"
 #include "VORUnicodeString.h"
+#include "VORXercesSupport.h"
 
 using namespace xercesc;
 
@@ -38,35 +39,6 @@ ThrowingPanicHandler& PanicHandlerInstance() {
   static ThrowingPanicHandler handler;
   return handler;
 }
-
-// Counts the bytes the parser holds and refuses more than the budget.
-class BudgetMemoryManager : public MemoryManager {
- public:
-  explicit BudgetMemoryManager(std::size_t budget) : _budget(budget) {}
-  MemoryManager* getExceptionMemoryManager() override { return XMLPlatformUtils::fgMemoryManager; }
-  void* allocate(XMLSize_t size) override {
-    if (_used + size > _budget)
-      throw OutOfMemoryException();
-    auto* block = static_cast<std::size_t*>(std::malloc(size + sizeof(std::max_align_t)));
-    if (block == nullptr)
-      throw OutOfMemoryException();
-    *block = size;
-    _used += size;
-    return reinterpret_cast<char*>(block) + sizeof(std::max_align_t);
-  }
-  void deallocate(void* p) override {
-    if (p == nullptr)
-      return;
-    auto* block = reinterpret_cast<std::size_t*>(static_cast<char*>(p) - sizeof(std::max_align_t));
-    _used -= *block;
-    std::free(block);
-  }
-  bool exceeded = false;
-
- private:
-  std::size_t _budget;
-  std::size_t _used = 0;
-};
 
 // Records the first error with its position.
 class FirstErrorHandler : public DOMErrorHandler {
@@ -141,7 +113,7 @@ std::string Where(const std::string& name, long line, long column) {
 }  // namespace
 
 struct VORXercesPlatform::Document::Impl {
-  std::unique_ptr<BudgetMemoryManager> memory;
+  std::unique_ptr<VORBudgetMemoryManager> memory;
   std::unique_ptr<FirstErrorHandler> errors;
   std::unique_ptr<NullResolver> resolver;
   std::unique_ptr<DepthFilter> filter;
@@ -233,8 +205,10 @@ Document ParseMemory(const std::string& content, const std::string& name, std::s
     error = name + ": file larger than " + std::to_string(limits.maxFileBytes) + " bytes";
     return result;
   }
+  if (!CheckRawText(content, name, error, limits))
+    return result;
   auto impl = std::make_unique<Document::Impl>();
-  impl->memory = std::make_unique<BudgetMemoryManager>(limits.maxMemoryBytes);
+  impl->memory = std::make_unique<VORBudgetMemoryManager>(limits.maxMemoryBytes);
   impl->errors = std::make_unique<FirstErrorHandler>();
   impl->resolver = std::make_unique<NullResolver>();
   impl->filter = std::make_unique<DepthFilter>(limits.maxDepth);
