@@ -16,6 +16,10 @@ if(PFV_SANITIZE)
   add_link_options(-fsanitize=address,undefined)
 endif()
 
+if(PFV_FUZZ)
+  add_compile_options(-fsanitize=fuzzer-no-link)
+endif()
+
 # pfv_layer(<name> SOURCES ... PUBLIC_DEPS ... PRIVATE_DEPS ...): a shared library whose public
 # headers live in include/ beside its sources.
 function(pfv_layer name)

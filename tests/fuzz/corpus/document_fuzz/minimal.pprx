@@ -1,0 +1,1 @@
+<pprDocument version="1"><process><activity id="A" type="BIWActivityRoot"/></process></pprDocument>
