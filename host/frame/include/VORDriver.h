@@ -36,6 +36,14 @@ class VORDriver {
   bool CancelCommand();
   VORCommand* GetRunningCommand() const;
 
+  // Undo and redo of the current document, one step per user command; false with a reason when
+  // there is nothing to undo or redo.
+  bool Undo();
+  bool Redo();
+  // Ends the current undo step unless a command is running (the GUI calls it after each user
+  // event; every driver step does it).
+  void EndUndoStep();
+
   // A pick in the tree: the object by id (or by label), with the objects above it.
   bool PickObject(const std::string& idOrLabel);
   // A click in a window (by title or name, empty: the current window) at a model point: through

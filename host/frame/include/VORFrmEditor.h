@@ -2,11 +2,13 @@
 // editor's sets are the ones the interaction layer's agents work with.
 #pragma once
 
+#include <memory>
 #include <string>
 
 #include "VORCSO.h"
 #include "VORCommand.h"
 #include "VORDocument.h"
+#include "VORFrmUndoStack.h"
 #include "VORHSO.h"
 #include "VORISO.h"
 #include "VORPSO.h"
@@ -32,6 +34,8 @@ class VORFrmEditor : public VORCommand {
   VORPSO* GetPSO() const { return _pso.get(); }
   VORHSO* GetHSO() const { return _hso.get(); }
   VORISO* GetISO() const { return _iso.get(); }
+  // The document's undo and redo history (records nothing for a document that is no process).
+  VORFrmUndoStack& GetUndoStack() { return *_undo; }
 
  protected:
   ~VORFrmEditor() override;
@@ -42,6 +46,7 @@ class VORFrmEditor : public VORCommand {
   VORPSO_var _pso;
   VORHSO_var _hso;
   VORISO_var _iso;
+  std::unique_ptr<VORFrmUndoStack> _undo;  // after the document: stops recording first
 };
 
 VOR_DECLARE_HANDLE(VORFrmEditor);

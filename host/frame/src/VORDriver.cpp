@@ -84,6 +84,7 @@ VORDriver::VORDriver() {
       "VORCommandEndNotification",
       [this](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
         auto* end = static_cast<VORCommandEndNotification*>(n);
+        EndUndoStep();           // what the command changed is one step
         CollectNotifications();  // what the command showed comes first
         _events.push_back("command " + end->GetCommand()->GetName().str() +
                           (end->IsCancelled() ? " cancelled" : " ended"));
@@ -107,6 +108,7 @@ bool VORDriver::Fail(const std::string& why) {
 bool VORDriver::Step(bool ok) {
   if (ok)
     _error.clear();
+  EndUndoStep();
   DrainDeferred();
   return ok;
 }
@@ -197,6 +199,35 @@ bool VORDriver::CancelCommand() {
 
 VORCommand* VORDriver::GetRunningCommand() const {
   return VORCommandEngine::Current();
+}
+
+void VORDriver::EndUndoStep() {
+  if (VORFrmEditor* editor = GetEditor();
+      editor != nullptr && VORCommandEngine::Current() == nullptr)
+    editor->GetUndoStack().EndStep();
+}
+
+bool VORDriver::Undo() {
+  VORFrmEditor* editor = GetEditor();
+  if (editor == nullptr)
+    return Fail("no document is open");
+  // An undo ends the running command first, as any other command would.
+  if (VORCommandEngine::Current() != nullptr)
+    VORCommandEngine::CancelCurrent();
+  if (!editor->GetUndoStack().Undo())
+    return Fail("nothing to undo");
+  return Step(true);
+}
+
+bool VORDriver::Redo() {
+  VORFrmEditor* editor = GetEditor();
+  if (editor == nullptr)
+    return Fail("no document is open");
+  if (VORCommandEngine::Current() != nullptr)
+    VORCommandEngine::CancelCurrent();
+  if (!editor->GetUndoStack().Redo())
+    return Fail("nothing to redo");
+  return Step(true);
 }
 
 VORBaseUnknown* VORDriver::FindObject(const std::string& idOrLabel) const {

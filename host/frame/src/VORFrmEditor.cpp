@@ -15,7 +15,8 @@ VORFrmEditor::VORFrmEditor(VORDocument* document)
       _cso(VORCSO_var::Adopt(new VORCSO())),
       _pso(VORPSO_var::Adopt(new VORPSO())),
       _hso(VORHSO_var::Adopt(new VORHSO())),
-      _iso(VORISO_var::Adopt(new VORISO())) {}
+      _iso(VORISO_var::Adopt(new VORISO())),
+      _undo(std::make_unique<VORFrmUndoStack>(dynamic_cast<VORProcess*>(document))) {}
 
 VORFrmEditor::~VORFrmEditor() = default;
 

@@ -174,6 +174,10 @@ bool VORScript::Execute(const std::vector<std::string>& w, std::string& error) {
     return args(1, 1, "start <command id>") && driverStep(_driver.StartCommand(w[1]));
   if (step == "cancel")
     return args(0, 0, "cancel") && driverStep(_driver.CancelCommand());
+  if (step == "undo")
+    return args(0, 0, "undo") && driverStep(_driver.Undo());
+  if (step == "redo")
+    return args(0, 0, "redo") && driverStep(_driver.Redo());
   if (step == "pick")
     return args(1, 1, "pick <object id or label>") && driverStep(_driver.PickObject(w[1]));
   if (step == "pick-at" || step == "context") {
