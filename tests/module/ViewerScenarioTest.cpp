@@ -12,6 +12,9 @@
 #include <vector>
 
 #include <cstdio>
+#include <fstream>
+#include <iterator>
+#include <regex>
 
 #include "QELFpaProductFlowViewer.h"
 #include "QELIFPAAdapters.h"
@@ -655,4 +658,53 @@ TEST_F(ViewerTest, OnGeneratedLevelsFlowsGoRightAndNoTwoNodesShareAPlace) {
   }
   EXPECT_GT(laidOut, 10);
   EXPECT_GT(refused, 5);
+}
+
+TEST_F(ViewerTest, ExportOfAllLevelsWritesAContentsPageAndOnePagePerActivityWithChildren) {
+  // Line > Body line > {S1 > {L1, J1}, S2, G > {S3 > {J2}}}: five levels have a chart.
+  auto line = Node(root, "Body line");
+  auto s1 = Node(line, "S1");
+  Node(s1, "L1", "BIWActivityLoading");
+  Node(s1, "J1", "BIWActivitySpotWelding");
+  Node(line, "S2");
+  auto group = Node(line, "G", "BIWActivityGrouping");
+  auto s3 = Node(group, "S3");
+  Node(s3, "J2", "BIWActivityClinching");
+  std::string error;
+  const std::string file = dir.Path() + "/nested.pprx";
+  ASSERT_TRUE(doc->SaveAs(file, error)) << error;
+  const std::string pdf = dir.Path() + "/plan.pdf";
+  int status = 0;
+  const std::string log =
+      RunProgram(PFV_BINARY " export " + file + " --all-levels --out " + pdf + " 2>&1", status);
+  ASSERT_EQ(status, 0) << log;
+  // Depth first, a parent before its children, each titled with its path.
+  const std::string rootPath = VORFrmObjectLabel(root).ConvertToUTF8();
+  const std::vector<std::string> expected{
+      "page 2: " + rootPath + " (1 nodes)", "page 3: " + rootPath + " / Body line (3 nodes)",
+      "page 4: " + rootPath + " / Body line / S1 (2 nodes)",
+      "page 5: " + rootPath + " / Body line / G (1 nodes)",
+      "page 6: " + rootPath + " / Body line / G / S3 (1 nodes)"};
+  size_t at = 0;
+  for (const std::string& want : expected) {
+    const size_t found = log.find(want, at);
+    ASSERT_NE(found, std::string::npos) << want << "\n" << log;
+    at = found;
+  }
+  std::ifstream in(pdf, std::ios::binary);
+  const std::string bytes((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+  ASSERT_EQ(bytes.rfind("%PDF", 0), 0u);
+  const std::regex page("/Type\\s*/Page\\b");
+  EXPECT_EQ(
+      std::distance(std::sregex_iterator(bytes.begin(), bytes.end(), page), std::sregex_iterator()),
+      6)
+      << "the contents and five charts";
+
+  // Without a PDF to write, or with one activity as well, the command says how to use it.
+  RunProgram(PFV_BINARY " export " + file + " --all-levels 2>&1", status);
+  EXPECT_NE(status, 0);
+  const std::string svg = RunProgram(
+      PFV_BINARY " export " + file + " --all-levels --out " + dir.Path() + "/p.svg 2>&1", status);
+  EXPECT_NE(status, 0);
+  EXPECT_NE(svg.find("writes a PDF"), std::string::npos) << svg;
 }

@@ -108,6 +108,51 @@ TEST_F(ControllerTest, DrawsOneLabelledBoxPerNodeAndOneOrthogonalArrowPerFlow) {
   EXPECT_EQ(count("<polyline class=\"PertLink\""), 8);  // route and arrow head of each flow
 }
 
+TEST_F(ControllerTest, LabelsFillTheirBoxAndWhatDoesNotFitIsElided) {
+  // A box of the document's size: the label is half its height, or shrinks down to 0.9 of
+  // that to show the whole name, else it is elided within a unit of margin each side.
+  doc->GetDoor().SetPertNodeSize(b, 30.0, 15.0);
+  doc->GetDoor().SetPertNodeSize(e, 30.0, 15.0);
+  VORBaseUnknown_var tail = Node(root, "Hemming tail", 150.0, 0.0);
+  doc->GetDoor().SetPertNodeSize(tail, 30.0, 15.0);
+  VORBaseUnknown_var unsized = Node(root, "Underbody respot", 200.0, 0.0);
+  Build(false);
+  ASSERT_EQ(controller->AddChildNode(tail), S_OK);
+  ASSERT_EQ(controller->AddChildNode(unsized), S_OK);
+  auto labelOf = [this](VORBaseUnknown* node) {
+    return dynamic_cast<VOR2DTextRep*>(controller->GetNodeRep(node)->GetChild(2));
+  };
+  VOR2DTextRep* short_ = labelOf(b);
+  ASSERT_NE(short_, nullptr);
+  EXPECT_DOUBLE_EQ(short_->GetHeight(), 7.5);
+  EXPECT_EQ(short_->GetShownText().ConvertToUTF8(), "B");
+  // 12 characters fit neither at 7.5 (54 wide) nor at the floor 6.75: six of 4.05 do.
+  VOR2DTextRep* shrunk = labelOf(tail);
+  EXPECT_DOUBLE_EQ(shrunk->GetHeight(), 6.75);
+  EXPECT_EQ(shrunk->GetShownText().ConvertToUTF8(), "Hemmi\u2026");
+  VOR2DTextRep* elided = labelOf(e);
+  EXPECT_EQ(elided->GetText().ConvertToUTF8(), "Spot welding cell") << "the whole name is kept";
+  EXPECT_EQ(elided->GetShownText().ConvertToUTF8(), "Spot \u2026");
+  for (VORBaseUnknown* node : {b.get(), e.get(), tail.get(), unsized.get()}) {
+    const VORBox2D box = controller->GetNodeRep(node)->GetBoundingBox();
+    const VORBox2D text = labelOf(node)->GetBoundingBox();
+    EXPECT_LE(text.Width(), box.Width() - 2.0);
+    EXPECT_LE(text.Height(), box.Height());
+  }
+  // A node without a stored size keeps its box widened for a label of 2, and its label is
+  // half the default height, or its floor 4.5 when the name fits no larger.
+  EXPECT_DOUBLE_EQ(labelOf(a)->GetHeight(), 5.0);
+  EXPECT_DOUBLE_EQ(labelOf(unsized)->GetHeight(), 4.5);
+  EXPECT_EQ(labelOf(unsized)->GetShownText().ConvertToUTF8(), "Underb\u2026");
+  const VORRenderList& list = viewer->GetRenderList();
+  int elidedItems = 0;
+  for (const VORRenderItem& item : list.Items())
+    elidedItems += item.tag == "PertLabel" && item.text.ConvertToUTF8().ends_with("\u2026");
+  EXPECT_EQ(elidedItems, 3) << "what is drawn is the elided text";
+  controller->RemoveChildNode(tail);
+  controller->RemoveChildNode(unsized);
+}
+
 TEST_F(ControllerTest, PickingFindsTheNodeUnderThePointerAndLinksFollowModelChanges) {
   Build(false);
   viewer->Reframe();

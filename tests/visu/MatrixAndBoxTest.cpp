@@ -156,6 +156,33 @@ TEST_F(RepBoxTest, TextBoxesFollowTheFixedPitchMetricAndAnchorCodes) {
   EXPECT_EQ(tall->GetBoundingBox(), VORBox2D(0.0, 0.0, 4.8, 4.0));
 }
 
+TEST_F(RepBoxTest, ALabelTooWideForItsRoomIsDrawnElidedAndMeasuredAsDrawn) {
+  using VORTextMetric::Elide;
+  const VORUnicodeString name("FF010 Front floor");  // 17 characters of 1.2 at height 2
+  EXPECT_EQ(Elide(name, 2.0, 0.0), name) << "no limit";
+  EXPECT_EQ(Elide(name, 2.0, 17 * 1.2), name) << "exactly as wide as the room";
+  EXPECT_EQ(Elide(name, 2.0, 17 * 1.2 - 0.01).ConvertToUTF8(), "FF010 Front flo\u2026");
+  EXPECT_EQ(Elide(name, 2.0, 6.0).ConvertToUTF8(), "FF01\u2026") << "five characters fit";
+  EXPECT_EQ(Elide(name, 2.0, 0.5).ConvertToUTF8(), "\u2026") << "at least the ellipsis";
+  EXPECT_EQ(Elide(VORUnicodeString("St\u00fctzenbock"), 2.0, 6.0).ConvertToUTF8(),
+            "St\u00fct\u2026")
+      << "cut between code points";
+
+  // The rep keeps the whole text; what is drawn, picked and written is the elided one.
+  auto label = Make<VOR2DTextRep>(name, VORMathPoint2Df(0.0f, 0.0f), 2, 2.0);
+  label->SetMaxWidth(6.0);
+  EXPECT_EQ(label->GetText(), name);
+  EXPECT_EQ(label->GetShownText().ConvertToUTF8(), "FF01\u2026");
+  EXPECT_DOUBLE_EQ(label->GetBoundingBox().Width(), 6.0);
+  VORRenderList list;
+  VORFlattenContext context;
+  context.list = &list;
+  label->Flatten(context);
+  ASSERT_EQ(list.Items().size(), 1u);
+  EXPECT_EQ(list.Items()[0].text.ConvertToUTF8(), "FF01\u2026");
+  EXPECT_DOUBLE_EQ(list.Items()[0].box.Width(), 6.0);
+}
+
 TEST_F(RepBoxTest, ArcsBoundOnlyTheQuadrantsTheyCross) {
   auto quarter = Make<VOR2DArcCircleRep>(VORMathPoint2Df(1.0f, 1.0f), 2.0f, 0.0f,
                                          static_cast<float>(std::numbers::pi / 2.0));

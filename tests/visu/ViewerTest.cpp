@@ -37,7 +37,7 @@ TEST_F(ViewerTest, ViewpointConvertsBothWaysZoomsAboutThePointerAndReframes) {
 
   const VORMathPoint2D before = vp->PixelToModel(123.0, 77.0);
   viewer->OnMouseWheel(123.0, 77.0, 240);
-  EXPECT_NEAR(vp->GetScale(), 4.0 * 1.21, 1e-12);
+  EXPECT_NEAR(vp->GetScale(), 4.0 * 1.25 * 1.25, 1e-12) << "two notches of 1.25";
   const VORMathPoint2D after = vp->PixelToModel(123.0, 77.0);
   EXPECT_NEAR(after.x, before.x, 1e-9);
   EXPECT_NEAR(after.y, before.y, 1e-9);

@@ -1,10 +1,13 @@
-// pfv export <document> [--activity <name or id>] [--organise] [--out chart.svg|chart.png]: writes
-// the PERT chart of the activity's children (default: the root process) as SVG (to standard output
-// without --out); --organise lays it out with the Product Flow Viewer's organiser first.
+// pfv export <document> [--activity <name or id>] [--organise] [--out
+// chart.svg|chart.png|chart.pdf]: writes the PERT chart of the activity's children (default: the
+// root process) as SVG (to standard output without --out); --organise lays it out with the Product
+// Flow Viewer's organiser first. --all-levels --out plan.pdf writes every level that has a chart,
+// one per page, after a contents page.
 #include <cstdio>
 #include <filesystem>
 #include <string>
 
+#include "PfvChartLevels.h"
 #include "PfvCommand.h"
 #include "PfvImageWriters.h"
 #include "QELPertChart.h"
@@ -43,11 +46,80 @@ VORBaseUnknown_var FindActivity(VORProcess* doc, const std::string& key) {
   return VORBaseUnknown_var();
 }
 
+// --organise: the default node positions of the Product Flow Viewer, by the organiser of the
+// viewer module (loaded by name; positions change in memory only). False when it is missing.
+bool Organise(VORBaseUnknown* root, QELPertController* controller) {
+  using ArrangeChart = int (*)(VORBaseUnknown*, QELPertController*);
+  auto arrange = reinterpret_cast<ArrangeChart>(
+      VORModuleLoader::FindSymbol("QELProductFlowViewer", "QELPFVArrangeChart"));
+  if (arrange == nullptr) {
+    std::fprintf(stderr, "pfv export: --organise needs the viewer module: %s\n",
+                 VORModuleLoader::LastError().c_str());
+    return false;
+  }
+  if (arrange(root, controller) == 1)
+    std::fprintf(stderr, "pfv export: the flows are cyclic; the stored positions are kept\n");
+  return true;
+}
+
+QELPertViewer* NewExportViewer() {
+  return new QELPertViewer(nullptr, "Export", QELPertParameters::PERT_VIEWER_STYLE, 800, 500,
+                           QELPertParameters::PERT_VIEWER_FLAGS);
+}
+
+// Every level with children, one page each after a contents page, in the book writer of out's
+// extension.
+int ExportAllLevels(VORProcess* doc, const std::string& document, const std::string& out,
+                    bool organise) {
+  const PfvBookWriterFactory* factory = PfvFindBookWriter(out);
+  if (factory == nullptr) {
+    std::fprintf(stderr, "pfv export: --all-levels writes a PDF (--out plan.pdf)%s\n",
+                 PfvFindBookWriter("x.pdf") ? "" : ", which this build cannot write");
+    return 1;
+  }
+  const std::vector<PfvChartLevel> levels = PfvChartLevels(doc);
+  std::vector<std::string> titles;
+  for (const PfvChartLevel& level : levels)
+    titles.push_back(level.path);
+  std::unique_ptr<PfvBookWriter> book =
+      (*factory)(std::filesystem::path(document).filename().string());
+  book->AddContents(titles);
+  int page = 1;  // the contents
+  for (const PfvChartLevel& level : levels) {
+    auto viewer = VORHandle<QELPertViewer>::Adopt(NewExportViewer());
+    auto controller =
+        VORHandle<QELPertController>::Adopt(QELPertBuildChart(level.activity, viewer));
+    if (!controller) {  // its page stays, with the title only, so the contents stay right
+      book->AddChart(level.path, *viewer);
+      ++page;
+      continue;
+    }
+    if (organise && !Organise(level.activity, controller)) {
+      controller->RemoveAllPertNodes();
+      return 1;
+    }
+    book->AddChart(level.path, *viewer);
+    std::fprintf(stderr, "pfv export: page %d: %s (%d nodes)\n", ++page, level.path.c_str(),
+                 controller->GetNodeCount());
+    controller->RemoveAllPertNodes();
+    VORDeferredDeletion::Drain();
+  }
+  std::string error;
+  if (!book->Finish(out, error)) {
+    std::fprintf(stderr, "pfv export: %s\n", error.c_str());
+    return 1;
+  }
+  std::fprintf(stderr, "pfv export: wrote %s (contents and %zu levels)\n", out.c_str(),
+               levels.size());
+  return 0;
+}
+
 int RunExport(const std::vector<std::string>& args) {
   std::string document;
   std::string activity;
   std::string out;
   bool organise = false;
+  bool allLevels = false;
   bool usage = false;
   for (size_t i = 0; i < args.size(); ++i) {
     const std::string& a = args[i];
@@ -57,16 +129,19 @@ int RunExport(const std::vector<std::string>& args) {
       out = args[++i];
     } else if (a == "--organise") {
       organise = true;
+    } else if (a == "--all-levels") {
+      allLevels = true;
     } else if (!a.empty() && a[0] != '-' && document.empty()) {
       document = a;
     } else {
       usage = true;
     }
   }
-  if (usage || document.empty()) {
+  if (usage || document.empty() || (allLevels && (out.empty() || !activity.empty()))) {
     std::fprintf(stderr,
                  "Usage: pfv export <document.pprx> [--activity <name or id>] [--organise] "
-                 "[--out chart.svg|chart.png]\n");
+                 "[--out chart.svg|chart.png|chart.pdf]\n"
+                 "       pfv export <document.pprx> --all-levels [--organise] --out plan.pdf\n");
     return 2;
   }
   std::string error;
@@ -74,6 +149,11 @@ int RunExport(const std::vector<std::string>& args) {
   if (!doc) {
     std::fprintf(stderr, "pfv export: %s\n", error.c_str());
     return 1;
+  }
+  if (allLevels) {
+    const int status = ExportAllLevels(doc, document, out, organise);
+    VORDeferredDeletion::Drain();
+    return status;
   }
   // Without --activity: the root process, the level the Product Flow Viewer opens on first.
   VORBaseUnknown_var root = activity.empty() ? doc->GetRootProcess() : FindActivity(doc, activity);
@@ -84,28 +164,14 @@ int RunExport(const std::vector<std::string>& args) {
   }
   int status = 0;
   {
-    auto viewer = VORHandle<QELPertViewer>::Adopt(
-        new QELPertViewer(nullptr, "Export", QELPertParameters::PERT_VIEWER_STYLE, 800, 500,
-                          QELPertParameters::PERT_VIEWER_FLAGS));
+    auto viewer = VORHandle<QELPertViewer>::Adopt(NewExportViewer());
     auto controller = VORHandle<QELPertController>::Adopt(QELPertBuildChart(root, viewer));
     if (!controller) {
       std::fprintf(stderr, "pfv export: \"%s\" cannot be shown as a chart\n", activity.c_str());
       return 1;
     }
-    // --organise: the default node positions of the Product Flow Viewer, by the organiser of the
-    // viewer module (loaded by name; positions change in memory only).
-    if (organise) {
-      using ArrangeChart = int (*)(VORBaseUnknown*, QELPertController*);
-      auto arrange = reinterpret_cast<ArrangeChart>(
-          VORModuleLoader::FindSymbol("QELProductFlowViewer", "QELPFVArrangeChart"));
-      if (arrange == nullptr) {
-        std::fprintf(stderr, "pfv export: --organise needs the viewer module: %s\n",
-                     VORModuleLoader::LastError().c_str());
-        return 1;
-      }
-      if (arrange(root, controller) == 1)
-        std::fprintf(stderr, "pfv export: the flows are cyclic; the stored positions are kept\n");
-    }
+    if (organise && !Organise(root, controller))
+      return 1;
     // Other formats than SVG come from the writers the build registers (PNG with the window).
     const PfvImageWriter* writer = out.empty() ? nullptr : PfvFindImageWriter(out);
     const std::string extension = std::filesystem::path(out).extension().string();
@@ -136,5 +202,8 @@ int RunExport(const std::vector<std::string>& args) {
 }  // namespace
 
 PFV_COMMAND(export, "export",
-            "<document.pprx> [--activity <name or id>] [--organise] [--out chart.svg|chart.png]",
-            "write the PERT chart of an activity's children as SVG (or PNG)", RunExport);
+            "<document.pprx> [--activity <name or id> | --all-levels] [--organise] "
+            "[--out chart.svg|chart.png|chart.pdf]",
+            "write the PERT chart of an activity's children as SVG (PNG, PDF); --all-levels: "
+            "every level, one PDF page each after a contents page",
+            RunExport);

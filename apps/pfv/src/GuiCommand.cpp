@@ -18,6 +18,7 @@
 #include "VORQtApplication.h"
 #include "VORQtImageExport.h"
 #include "VORQtMainWindow.h"
+#include "VORQtPdfBook.h"
 #include "VORQtStrings.h"
 #include "VORQtViewerWidget.h"
 #include "VORScript.h"
@@ -146,5 +147,32 @@ PFV_COMMAND(gui, "gui", "[document.pprx] [--script FILE] [--screenshot FILE.png]
             "open the window (also without a sub-command); --has-gui tells whether one can open",
             RunGui);
 static const bool pfvPngWriter = PfvRegisterImageWriter("png", WritePNG);
+
+namespace {
+class PdfBook : public PfvBookWriter {
+ public:
+  explicit PdfBook(const std::string& title) : _book(title) {}
+  void AddContents(const std::vector<std::string>& titles) override { _book.AddContents(titles); }
+  void AddChart(const std::string& title, VORViewer& viewer) override {
+    _book.AddChart(title, viewer);
+  }
+  bool Finish(const std::string& path, std::string& error) override {
+    return _book.Finish(path, error);
+  }
+
+ private:
+  VORQtPdfBook _book;
+};
+}  // namespace
+
+static const bool pfvPdfWriter = PfvRegisterImageWriter(
+    "pdf", [](VORViewer& viewer, const std::string& path, std::string& error) {
+      return VORQtPdfBook::WriteChart(viewer, std::filesystem::path(path).stem().string(), path,
+                                      error);
+    });
+static const bool pfvPdfBook =
+    PfvRegisterBookWriter("pdf", [](const std::string& title) -> std::unique_ptr<PfvBookWriter> {
+      return std::make_unique<PdfBook>(title);
+    });
 
 #endif

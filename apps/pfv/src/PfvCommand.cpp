@@ -33,9 +33,12 @@ void PfvInitialiseProcess(const char* argv0) {
   if (ec)
     exe = fs::absolute(argv0 ? argv0 : "pfv", ec);
   const fs::path binDir = exe.parent_path();
-  // Built tree: <build>/bin/pfv, modules in <build>/lib, sources two levels up.
+  // Built tree: <build>/bin/pfv, modules in <build>/lib, sources two levels up. Installed:
+  // <prefix>/bin/pfv, modules in <prefix>/lib/pfv, resources in <prefix>/share/pfv/resources.
   const fs::path libDir = binDir.parent_path() / "lib";
-  VORModuleLoader::SetSearchPath(libDir.string());
+  const fs::path installedLibDir = libDir / "pfv";
+  VORModuleLoader::SetSearchPath(fs::is_directory(installedLibDir, ec) ? installedLibDir.string()
+                                                                       : libDir.string());
   if (std::getenv("VORStartupPath") == nullptr) {
     for (const fs::path& candidate :
          {binDir.parent_path().parent_path().parent_path() / "resources",

@@ -10,10 +10,24 @@ std::map<std::string, PfvImageWriter>& Writers() {
   return writers;
 }
 
+std::map<std::string, PfvBookWriterFactory>& BookWriters() {
+  static std::map<std::string, PfvBookWriterFactory> writers;
+  return writers;
+}
+
 std::string Lower(std::string s) {
   std::transform(s.begin(), s.end(), s.begin(),
                  [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
   return s;
+}
+
+// The lower-case extension of path without the dot; empty when it has none.
+std::string ExtensionOf(const std::string& path) {
+  const size_t dot = path.find_last_of('.');
+  const size_t slash = path.find_last_of('/');
+  if (dot == std::string::npos || (slash != std::string::npos && dot < slash))
+    return std::string();
+  return Lower(path.substr(dot + 1));
 }
 }  // namespace
 
@@ -23,12 +37,18 @@ bool PfvRegisterImageWriter(const std::string& extension, PfvImageWriter writer)
 }
 
 const PfvImageWriter* PfvFindImageWriter(const std::string& path) {
-  const size_t dot = path.find_last_of('.');
-  const size_t slash = path.find_last_of('/');
-  if (dot == std::string::npos || (slash != std::string::npos && dot < slash))
-    return nullptr;
-  auto it = Writers().find(Lower(path.substr(dot + 1)));
+  auto it = Writers().find(ExtensionOf(path));
   return it == Writers().end() ? nullptr : &it->second;
+}
+
+bool PfvRegisterBookWriter(const std::string& extension, PfvBookWriterFactory factory) {
+  BookWriters()[Lower(extension)] = std::move(factory);
+  return true;
+}
+
+const PfvBookWriterFactory* PfvFindBookWriter(const std::string& path) {
+  auto it = BookWriters().find(ExtensionOf(path));
+  return it == BookWriters().end() ? nullptr : &it->second;
 }
 
 std::vector<std::string> PfvImageWriterExtensions() {

@@ -24,6 +24,8 @@
 class VORFrmWindow;
 class QELEPertNodeExt;
 
+class VOR2DTextRep;
+
 class QELPertController : public VORCommand {
   VOR_DECLARE_CLASS(QELPertController, VORCommand)
  public:
@@ -89,6 +91,9 @@ class QELPertController : public VORCommand {
     double y = 0.0;
     double w = 0.0;
     double h = 0.0;
+    // The node's model events, followed for position changes made elsewhere (undo, redo).
+    VORHandle<VOREventPublisher> events;
+    VORCallbackId moved = 0;
   };
   struct Level {
     VORBaseUnknown* owner = nullptr;  // root or super node (not held)
@@ -111,6 +116,8 @@ class QELPertController : public VORCommand {
   void UpdateLink(Link* link);
   void BuildShape(Node* node);
   void PlaceNode(Node* node);
+  static void FitLabel(VOR2DTextRep& label, const VORUnicodeString& text, double boxWidth,
+                       double boxHeight);
   void PlaceInnerNodes(Node* node);
   void ReadPosition(Node* node);
   void ShiftInner(Node* node, double dx, double dy);
@@ -119,6 +126,9 @@ class QELPertController : public VORCommand {
   void DispatchPosition(Node* node);
   void OnManipulate(VORNotification* notification);
   void OnEndManipulate(VORNotification* notification);
+  void FollowModel(Node* node);
+  void UnfollowModel(Node* node);
+  void OnModelMoved(Node* node);
   Node* DraggedNode() const;
   void ClearChart();
 

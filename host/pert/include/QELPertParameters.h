@@ -24,6 +24,12 @@ struct QELPertParameters {
   // Smallest node box; a node grows to hold its label with one label height of margin.
   static inline double PERT_NODE_WIDTH = 20.0;
   static inline double PERT_NODE_HEIGHT = 10.0;
+  // A node's label: at most this fraction of the box height, at least this fraction of that
+  // when shrinking keeps the whole name (elided below), with this margin (model units) left and
+  // right of the text.
+  static constexpr double PERT_LABEL_BOX_RATIO = 0.5;
+  static constexpr double PERT_LABEL_SHRINK_FLOOR = 0.9;
+  static constexpr double PERT_LABEL_PADDING = 1.0;
   // Space between an expanded super node's border and its inner chart.
   static inline double PERT_SUPER_NODE_MARGIN = 5.0;
 

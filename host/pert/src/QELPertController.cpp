@@ -4,6 +4,7 @@
 #include <cmath>
 
 #include "QELIPertNode.h"
+#include "QELPertActivityColors.h"
 #include "QELIPertPosition.h"
 #include "QELPertClientVisuServices.h"
 #include "QELPertNodeData.h"
@@ -13,6 +14,8 @@
 #include "VOR2DTextRep.h"
 #include "VORIGENode.h"
 #include "VORIModelEvents.h"
+#include "VORModify.h"
+#include "VORISPPActivity.h"
 #include "VORISPPFlowMgt.h"
 #include "VORTextMetric.h"
 
@@ -161,13 +164,17 @@ QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Leve
   _nodes.emplace(Key(object), std::move(owned));
   level->members.push_back(node);
   ReadPosition(node);
+  FollowModel(node);
 
   node->bag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
   node->bag->SetTag("PertNode");
   node->bag->SetObject(node->object);
   const std::vector<VORMathPoint2Df> empty = BoxPoints(0.0, 0.0);
   auto box = VORHandle<VOR2DPolygonRep>::Adopt(new VOR2DPolygonRep(empty, 1));
-  box->SetFillColorIndex(QELPertParameters::NodeFillColor);
+  // Filled by the kind of activity, so that a station is told from a loading at a glance.
+  VORISPPActivity_var activity(node->object);
+  box->SetFillColorIndex(
+      QELPertActivityColors::FillColorOf(activity ? activity->GetActivityType().str() : ""));
   box->SetColorIndex(QELPertParameters::NodeBorderColor);
   node->bag->AddChild(box);
   auto label = VORHandle<VOR2DTextRep>::Adopt(new VOR2DTextRep(
@@ -230,12 +237,29 @@ void QELPertController::BuildShape(Node* node) {
   }
   node->w = w;
   node->h = h;
+  // An expanded super node keeps its label at the chart's label height, above the inner chart.
+  const bool expanded = node->inner && !node->inner->members.empty();
+  FitLabel(*label, text, w, expanded ? labelHeight / QELPertParameters::PERT_LABEL_BOX_RATIO : h);
   box->Modify(BoxPoints(w, h));
   // A super node (expanded or collapsed) has a double-weight border.
   box->SetLineThickness(state == PertNodeNone ? 1 : 2);
   label->Modify(VORMathPoint2Df(0.0f, static_cast<float>(labelY)));
   if (node->ext != nullptr)
     node->ext->SetDrawnSize(w, h);
+}
+
+void QELPertController::FitLabel(VOR2DTextRep& label, const VORUnicodeString& text, double boxWidth,
+                                 double boxHeight) {
+  // As large as the box allows, so that a chart fitted to its window stays readable; smaller
+  // down to a floor when that saves the whole name; elided below the floor.
+  const double room = std::max(boxWidth - 2.0 * QELPertParameters::PERT_LABEL_PADDING, 0.0);
+  const double largest = boxHeight * QELPertParameters::PERT_LABEL_BOX_RATIO;
+  const double smallest = largest * QELPertParameters::PERT_LABEL_SHRINK_FLOOR;
+  const int length = std::max(text.GetLengthInChar(), 1);
+  const double fitting = room / (length * VORTextMetric::kCharWidthRatio);
+  const double height = std::max(std::min(largest, fitting), smallest);
+  label.SetHeight(std::max(height, QELPertParameters::PERT_LABEL_HEIGHT));
+  label.SetMaxWidth(room);
 }
 
 void QELPertController::PlaceNode(Node* node) {
@@ -458,6 +482,7 @@ void QELPertController::RemoveNode(Node* node, bool announce) {
     _manipulator->RemoveElement(node->bag);
   level->nodes->RemoveChild(node->bag);
   VORBaseUnknown_var object = node->object;
+  UnfollowModel(node);
   if (QELEPertNodeExt* ext = node->ext) {
     ext->SetReference(nullptr);
     ext->SetDrawnSize(0.0, 0.0);
@@ -515,6 +540,7 @@ HRESULT QELPertController::RemoveChildNode(VORBaseUnknown_var& object) {
 
 void QELPertController::ClearChart() {
   for (auto& [key, node] : _nodes) {
+    UnfollowModel(node.get());
     if (QELEPertNodeExt* ext = node->ext) {
       ext->SetReference(nullptr);
       ext->SetDrawnSize(0.0, 0.0);
@@ -555,6 +581,53 @@ void QELPertController::RefreshLinks() {
   }
   for (auto& [key, node] : _nodes)
     AddLinksOf(node.get());
+}
+
+void QELPertController::FollowModel(Node* node) {
+  VORIModelEvents_var events(node->object);
+  if (!events)
+    return;
+  node->events = events->GetEventPublisher();
+  if (!node->events)
+    return;
+  node->moved = node->events->AddCallback(
+      VORModify::ClassName(),
+      [this, node](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
+        if (auto* modify = dynamic_cast<VORModify*>(n); modify && modify->GetWhat() == "position")
+          OnModelMoved(node);
+      });
+}
+
+void QELPertController::UnfollowModel(Node* node) {
+  if (node->events)
+    node->events->RemoveCallback(node->moved);
+  node->events = VORHandle<VOREventPublisher>();
+  node->moved = 0;
+}
+
+void QELPertController::OnModelMoved(Node* node) {
+  if (!node->layout || node->ext == nullptr)
+    return;
+  const bool has = node->layout->HasPertPosition();
+  double x = node->x;
+  double y = node->y;
+  if (has)
+    node->layout->GetPertPosition(x, y);
+  // A drag or the organiser moved the node through the chart, which already holds the new
+  // position; a change made elsewhere (undo, redo, a script) moves the box, its links and its
+  // ZitBlts here.
+  double cx = 0.0;
+  double cy = 0.0;
+  if (has && node->ext->HasPosition() && node->ext->GetPosition(cx, cy, 1) == S_OK && cx == x &&
+      cy == y)
+    return;
+  if (has)
+    node->ext->SetPosition(x, y, 1);
+  else
+    node->ext->ResetPosition();
+  VORBaseUnknown_var object = node->object;
+  RefreshNodePositionInPert(object, true);
+  DispatchPosition(node);
 }
 
 QELPertController::Node* QELPertController::DraggedNode() const {

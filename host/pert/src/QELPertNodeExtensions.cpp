@@ -82,6 +82,9 @@ class QELEPertNode : public VORExtension, public QELIPertNode {
     QELEPertNodeExt* ext = QELEPertNodeExt::Of(GetExtendedObject());
     if (ext == nullptr)
       return E_FAIL;
+    // The chart's own position first: a chart that hears of the document change then knows it
+    // made it (see QELPertController::OnModelMoved).
+    const HRESULT hr = ext->SetPosition(x, y, index);
     if (index == 1) {
       VORIGraphNodeLayout_var layout(GetExtendedObject());
       if (!layout)
@@ -93,7 +96,7 @@ class QELEPertNode : public VORExtension, public QELIPertNode {
       if (!layout->HasPertPosition() || ox != x || oy != y)
         layout->SetPertPosition(x, y);
     }
-    return ext->SetPosition(x, y, index);
+    return hr;
   }
   HRESULT GetSize(double& width, double& height) override {
     QELEPertNodeExt* ext = QELEPertNodeExt::Of(GetExtendedObject());

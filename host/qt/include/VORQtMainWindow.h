@@ -8,8 +8,7 @@
 #include <QMainWindow>
 #include <QPointer>
 #include <QStringList>
-#include <functional>
-#include <map>
+#include <cstdint>
 #include <memory>
 
 #include "VORDriver.h"
@@ -20,7 +19,10 @@ class QMdiArea;
 class QMdiSubWindow;
 class QMenu;
 class QToolBar;
+class VORQtChangeWatch;
+class VORQtCommandActions;
 class VORQtDialogManager;
+class VORQtMdiMirror;
 class VORQtDocumentTree;
 class VORQtViewerWidget;
 
@@ -42,13 +44,17 @@ class VORQtMainWindow : public QMainWindow {
   bool OpenDocument(const QString& path);
   bool SaveDocument();
   bool SaveDocumentAs(const QString& path);
-  // Writes the current chart window's scene as SVG or PNG (by extension).
+  // Writes the current chart window's scene as PNG, PDF or SVG (by extension, SVG otherwise).
   bool ExportChart(const QString& path, QString* error = nullptr);
+  // Undoes / redoes the current document's last user command (Edit menu, Ctrl+Z, Ctrl+Shift+Z).
+  bool Undo();
+  bool Redo();
   // Starts a workbench command (or declared host command) by id.
   bool StartCommand(const QString& id);
 
   // Brings the window up to date after a step: MDI windows, tree, selection, status bar,
-  // viewers. Cheap when nothing changed.
+  // viewers, as far as the notifications since the last step say they changed. Cheap when
+  // nothing changed.
   void AfterStep();
 
   QMdiArea* MdiArea() const { return _mdi; }
@@ -64,25 +70,27 @@ class VORQtMainWindow : public QMainWindow {
   QStringList RecentFiles() const;
   QString PromptText() const;
   QString LastMessage() const;
+  // The status bar's summary of the activity under the pointer.
+  QString HoverText() const;
 
  protected:
   void closeEvent(QCloseEvent* event) override;
 
  private:
   void BuildMenus();
-  void FillCommands();
+  void CatchUp(std::uint32_t changes);
   void AddRecentFile(const QString& path);
   void UpdateRecentMenu();
   void UpdateWindowMenu();
-  void SyncWindows();
-  QWidget* MakeWindowWidget(VORFrmWindow* window);
   void SetMessage(const QString& text);
   void RestoreGeometry();
   void SaveGeometry();
   bool ConfirmDiscard();
-  QString StateSignature() const;
 
   std::unique_ptr<VORDriver> _driver;
+  std::unique_ptr<VORQtChangeWatch> _watch;
+  std::unique_ptr<VORQtCommandActions> _commands;
+  std::unique_ptr<VORQtMdiMirror> _mirror;
   QMdiArea* _mdi = nullptr;
   VORQtDocumentTree* _tree = nullptr;
   VORQtDialogManager* _dialogs = nullptr;
@@ -90,19 +98,12 @@ class VORQtMainWindow : public QMainWindow {
   QMenu* _recentMenu = nullptr;
   QMenu* _windowMenu = nullptr;
   QToolBar* _flowToolBar = nullptr;
+  QAction* _undo = nullptr;
+  QAction* _redo = nullptr;
   QLabel* _prompt = nullptr;
   QLabel* _message = nullptr;
-  std::map<QString, QAction*> _commandActions;
-
-  struct MdiEntry {
-    VORFrmWindow_var window;
-    QPointer<QMdiSubWindow> sub;
-    std::function<void()> cleanup;  // what the shell built for the window, undone at its end
-  };
-  std::map<VORFrmWindow*, MdiEntry> _windows;
+  QLabel* _hover = nullptr;
   VORDocument* _treeDocument = nullptr;
-  int _commandsEnded = 0;
   int _treeBuiltAt = -1;
-  QString _signature;
   bool _syncing = false;
 };

@@ -23,7 +23,8 @@ class VORQtViewerWidget : public QWidget {
 
   VORViewer* GetViewer() const { return _viewer.get(); }
 
-  // Fits everything shown into the window.
+  // Fits everything shown into the window, and keeps it fitted through resizes until the view
+  // is zoomed or panned.
   void FitAll();
   // Catches up with the viewer: repaints what changed (nothing when nothing did), cursor,
   // balloons. Called after every forwarded event, and once after the current step when the
@@ -57,6 +58,8 @@ class VORQtViewerWidget : public QWidget {
  signals:
   // After a Sync that changed the viewpoint (pan, zoom, fit).
   void viewChanged();
+  // The pointer came over another activity: its one-line summary (empty when none).
+  void hoveredActivity(const QString& summary);
 
  protected:
   void paintEvent(QPaintEvent* event) override;
@@ -85,6 +88,9 @@ class VORQtViewerWidget : public QWidget {
   bool ChangedArea(const VORRenderList& list, QRectF& area) const;
   void UpdateCursor();
   void UpdateBalloon();
+  // The activity under pixel (none: null pixel) becomes the hovered one: whole name as the
+  // tooltip, summary to the status bar.
+  void UpdateHover(const QPointF* pixel);
   static int ModifiersOf(Qt::KeyboardModifiers modifiers);
 
   VORViewer_var _viewer;
@@ -97,9 +103,11 @@ class VORQtViewerWidget : public QWidget {
   double _gridCellSize = 0.0;
   bool _antialias = true;
   bool _spaceDown = false;
+  bool _keepFitted = false;  // fitted and not zoomed or panned since: resizes fit again
   bool _spacePanning = false;
   int _cursorCode = -1;
   QString _balloonText;
+  VORBaseUnknown_var _hovered;
   QPointer<QMenu> _menu;
 
   // State at the last Sync.

@@ -4,132 +4,43 @@
 #include <QActionGroup>
 #include <QApplication>
 #include <QCloseEvent>
-#include <QMoveEvent>
-#include <QResizeEvent>
 #include <QDockWidget>
 #include <QFileDialog>
 #include <QFileInfo>
-#include <QIcon>
 #include <QLabel>
 #include <QMdiArea>
 #include <QMdiSubWindow>
 #include <QMenu>
 #include <QMenuBar>
 #include <QMessageBox>
-#include <QPainter>
-#include <QPlainTextEdit>
 #include <QProgressDialog>
 #include <QStatusBar>
-#include <QTimer>
 #include <QToolBar>
 
-#include "VORCommandEngine.h"
-#include "VORCommandHeader.h"
-#include "VOREnv.h"
+#include "VORDocument.h"
 #include "VORFrmWindowKinds.h"
-#include "VORPixelImage.h"
 #include "VORQtApplication.h"
+#include "VORQtChangeWatch.h"
+#include "VORQtCommandActions.h"
 #include "VORQtDialogs.h"
-#include "VORQtImageExport.h"
 #include "VORQtDocumentTree.h"
+#include "VORQtImageExport.h"
+#include "VORQtMdiMirror.h"
+#include "VORQtPdfBook.h"
 #include "VORQtStrings.h"
 #include "VORQtViewerWidget.h"
 #include "VORSVGWriter.h"
 #include "VORSettingRepository.h"
 #include "VORStateCommand.h"
 #include "VORViewer.h"
-#include "VORDocument.h"
 #include "VORWorkbench.h"
 
-#if __has_include("QELPertChart.h")
-#include "QELPertChart.h"
-#include "QELPertViewer.h"
-#define PFV_QT_WITH_PERT 1
-#endif
-
-namespace {
-
-// An MDI window showing one frame window; closing it deletes the frame window.
-class VORQtMdiWindow : public QMdiSubWindow {
- public:
-  explicit VORQtMdiWindow(VORFrmWindow* window) : _window(window) {
-    setAttribute(Qt::WA_DeleteOnClose);
-    setObjectName(VORQtString(window->GetName()));
-  }
-  VORFrmWindow* Window() const { return _window.get(); }
-  bool hasViewer = false;
-
- protected:
-  void closeEvent(QCloseEvent* event) override {
-    if (_window && !_window->IsDeleted())
-      _window->DeleteWindow();
-    QMdiSubWindow::closeEvent(event);
-  }
-  // The frame window knows its place (its title is shortened to its width).
-  void resizeEvent(QResizeEvent* event) override {
-    QMdiSubWindow::resizeEvent(event);
-    TellRectangle();
-  }
-  void moveEvent(QMoveEvent* event) override {
-    QMdiSubWindow::moveEvent(event);
-    TellRectangle();
-  }
-  void TellRectangle() {
-    if (_window && !_window->IsDeleted())
-      _window->SetRectangle(VORRectangle{x(), y(), width(), height()});
-  }
-
- private:
-  VORFrmWindow_var _window;
-};
-
-VORViewer* ViewerOf(VORFrmWindow* window) {
-  return window ? dynamic_cast<VORViewer*>(window->GetViewer()) : nullptr;
-}
-
-// An icon for a command without an icon file: its initials on a tile.
-QIcon LetterIcon(const QString& title) {
-  QString letters;
-  for (const QString& word : title.split(' ', Qt::SkipEmptyParts)) {
-    if (letters.size() < 2 && word[0].isLetterOrNumber())
-      letters += word[0].toUpper();
-  }
-  QPixmap pixmap(32, 32);
-  pixmap.fill(Qt::transparent);
-  QPainter p(&pixmap);
-  p.setRenderHint(QPainter::Antialiasing);
-  p.setBrush(QColor(70, 90, 120));
-  p.setPen(Qt::NoPen);
-  p.drawRoundedRect(QRectF(1, 1, 30, 30), 6, 6);
-  p.setPen(Qt::white);
-  QFont font = p.font();
-  font.setBold(true);
-  font.setPixelSize(letters.size() > 1 ? 13 : 17);
-  p.setFont(font);
-  p.drawText(QRectF(0, 0, 32, 32), Qt::AlignCenter, letters.isEmpty() ? "?" : letters);
-  p.end();
-  return QIcon(pixmap);
-}
-
-QIcon CommandIcon(const VORWorkbenchCommand& command) {
-  // The configured name as it stands, else with the usual image extensions.
-  for (const char* extension : {"", ".png", ".svg", ".bmp"}) {
-    if (command.icon.empty())
-      break;
-    VORUnicodeString path;
-    if (FAILED(VORGetImagePathName(VORUnicodeString(command.icon + extension), path)))
-      continue;
-    QIcon icon(VORQtString(path));
-    if (!icon.isNull() && !icon.availableSizes().isEmpty())
-      return icon;
-  }
-  return LetterIcon(VORQtString(command.title.empty() ? command.id : command.title));
-}
-
-}  // namespace
-
 VORQtMainWindow::VORQtMainWindow(QWidget* parent)
-    : QMainWindow(parent), _driver(std::make_unique<VORDriver>()) {
+    : QMainWindow(parent),
+      _driver(std::make_unique<VORDriver>()),
+      _watch(std::make_unique<VORQtChangeWatch>(*_driver)),
+      _commands(
+          std::make_unique<VORQtCommandActions>([this](const QString& id) { StartCommand(id); })) {
   setObjectName(QStringLiteral("MainWindow"));
   setWindowTitle(tr("Product Flow Viewer"));
   _dialogs = new VORQtDialogManager(this);
@@ -142,11 +53,12 @@ VORQtMainWindow::VORQtMainWindow(QWidget* parent)
   _mdi->setHorizontalScrollBarPolicy(Qt::ScrollBarAsNeeded);
   _mdi->setVerticalScrollBarPolicy(Qt::ScrollBarAsNeeded);
   setCentralWidget(_mdi);
+  _mirror = std::make_unique<VORQtMdiMirror>(_mdi);
   connect(_mdi, &QMdiArea::subWindowActivated, this, [this](QMdiSubWindow* sub) {
-    auto* mdi = dynamic_cast<VORQtMdiWindow*>(sub);
-    if (_syncing || mdi == nullptr || mdi->Window()->IsDeleted())
+    VORFrmWindow* window = VORQtMdiMirror::WindowOf(sub);
+    if (_syncing || window == nullptr)
       return;
-    VORFrmLayout::GetCurrentLayout()->SetCurrentWindow(mdi->Window());
+    VORFrmLayout::GetCurrentLayout()->SetCurrentWindow(window);
     AfterStep();
   });
 
@@ -163,27 +75,26 @@ VORQtMainWindow::VORQtMainWindow(QWidget* parent)
   _message->setObjectName(QStringLiteral("LastMessage"));
   statusBar()->addWidget(_prompt);
   statusBar()->addWidget(_message, 1);
+  _hover = new QLabel(this);
+  _hover->setObjectName(QStringLiteral("Hovered"));
+  statusBar()->addPermanentWidget(_hover);
+  _mirror->onNewChart = [this](VORQtViewerWidget& chart) {
+    connect(&chart, &VORQtViewerWidget::hoveredActivity, _hover, &QLabel::setText);
+  };
 
   BuildMenus();
-  FillCommands();
+  _commands->FillWorkbench(_flowMenu, _flowToolBar);
   dock->toggleViewAction()->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_T));
   if (QMenu* view = menuBar()->findChild<QMenu*>(QStringLiteral("ViewMenu")))
     view->addAction(dock->toggleViewAction());
   RestoreGeometry();
 
-  VORCommandEngine::GetEventPublisher()->AddCallback(
-      "VORCommandEndNotification",
-      [this](VORBaseUnknown*, const std::string&, VORNotification*, void*, VORCallbackId) {
-        ++_commandsEnded;
-      },
-      nullptr, this);
   if (VORQtApplication* app = VORQtApplication::Instance())
     app->AddAfterEventHook(this, [this]() { AfterStep(); });
   AfterStep();
 }
 
 VORQtMainWindow::~VORQtMainWindow() {
-  VORCommandEngine::GetEventPublisher()->RemoveCallbacksOf(this);
   if (VORQtApplication* app = VORQtApplication::Instance())
     app->RemoveAfterEventHooks(this);
   // Signals of children dying below must not reach this half-destroyed window.
@@ -191,15 +102,10 @@ VORQtMainWindow::~VORQtMainWindow() {
   _tree->disconnect(this);
   // Widgets showing viewers go before the driver closes the windows that hold them.
   _syncing = true;
-  for (auto& [window, entry] : _windows) {
-    if (entry.sub)
-      delete entry.sub;
-    if (entry.cleanup)
-      entry.cleanup();
-  }
-  _windows.clear();
+  _mirror->Clear();
   delete _dialogs;
   _dialogs = nullptr;
+  _watch.reset();
   _driver.reset();
 }
 
@@ -232,11 +138,12 @@ void VORQtMainWindow::BuildMenus() {
   QAction* exportChart = file->addAction(tr("&Export Chart..."), this, [this]() {
     QString filter;
     QString path = QFileDialog::getSaveFileName(
-        this, tr("Export chart"), QString(), tr("SVG image (*.svg);;PNG image (*.png)"), &filter);
+        this, tr("Export chart"), QString(),
+        tr("PNG image (*.png);;SVG image (*.svg);;PDF document (*.pdf)"), &filter);
     if (path.isEmpty())
       return;
     if (QFileInfo(path).suffix().isEmpty())
-      path += filter.contains("png") ? ".png" : ".svg";
+      path += filter.contains("png") ? ".png" : filter.contains("pdf") ? ".pdf" : ".svg";
     QString error;
     if (!ExportChart(path, &error))
       QMessageBox::critical(this, tr("Export failed"), error);
@@ -247,6 +154,15 @@ void VORQtMainWindow::BuildMenus() {
   QAction* quit = file->addAction(tr("&Quit"), this, [this]() { close(); });
   quit->setShortcut(QKeySequence::Quit);
   quit->setObjectName(QStringLiteral("Quit"));
+
+  QMenu* edit = menuBar()->addMenu(tr("&Edit"));
+  edit->setObjectName(QStringLiteral("EditMenu"));
+  _undo = edit->addAction(tr("&Undo"), this, [this]() { Undo(); });
+  _undo->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_Z));
+  _undo->setObjectName(QStringLiteral("Undo"));
+  _redo = edit->addAction(tr("&Redo"), this, [this]() { Redo(); });
+  _redo->setShortcut(QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_Z));
+  _redo->setObjectName(QStringLiteral("Redo"));
 
   _flowMenu = menuBar()->addMenu(tr("&Product Flow"));
   _flowMenu->setObjectName(QStringLiteral("ProductFlowMenu"));
@@ -272,12 +188,8 @@ void VORQtMainWindow::BuildMenus() {
   const std::pair<const char*, QString> hostWindows[] = {
       {VORFrmHostCommands::PertChart, tr("Classic PERT Chart")},
       {VORFrmHostCommands::ProductSpace, tr("Product Space")}};
-  for (const auto& [id, title] : hostWindows) {
-    QAction* action =
-        view->addAction(title, this, [this, id = QString(id)]() { StartCommand(id); });
-    action->setObjectName(QString(id));
-    _commandActions[QString(id)] = action;
-  }
+  for (const auto& [id, title] : hostWindows)
+    _commands->AddHostCommand(view, QString(id), title);
   view->addSeparator();
 
   _windowMenu = menuBar()->addMenu(tr("&Window"));
@@ -287,35 +199,24 @@ void VORQtMainWindow::BuildMenus() {
   UpdateRecentMenu();
 }
 
-void VORQtMainWindow::FillCommands() {
-  int n = 0;
-  for (const VORWorkbenchCommand& command : VORWorkbench::Commands()) {
-    const QString id = VORQtString(command.id);
-    const QString title = VORQtString(command.title.empty() ? command.id : command.title);
-    QAction* action = _flowMenu->addAction(CommandIcon(command), title);
-    action->setObjectName(id);
-    action->setToolTip(title + " (" + id + ")");
-    action->setStatusTip(title);
-    if (++n <= 9)
-      action->setShortcut(QKeySequence(Qt::CTRL | Qt::SHIFT | static_cast<Qt::Key>(Qt::Key_0 + n)));
-    if (!VORWorkbench::IsInstalled(command)) {
-      // Listed but not installed in this build: shown, greyed, with the reason.
-      action->setEnabled(false);
-      action->setToolTip(title + tr(" (not installed: ") + VORQtString(command.module) + ")");
-    }
-    connect(action, &QAction::triggered, this, [this, id]() { StartCommand(id); });
-    _flowToolBar->addAction(action);
-    _commandActions[id] = action;
-  }
-  if (n == 0) {
-    QAction* none = _flowMenu->addAction(tr("(no commands registered)"));
-    none->setEnabled(false);
-  }
+QAction* VORQtMainWindow::CommandAction(const QString& id) const {
+  return _commands->Find(id);
 }
 
-QAction* VORQtMainWindow::CommandAction(const QString& id) const {
-  auto it = _commandActions.find(id);
-  return it == _commandActions.end() ? nullptr : it->second;
+bool VORQtMainWindow::Undo() {
+  const bool ok = _driver->Undo();
+  SetMessage(ok ? tr("Undone") : VORQtString(_driver->LastError()));
+  _watch->Mark(VORQtChangeWatch::Document);
+  AfterStep();
+  return ok;
+}
+
+bool VORQtMainWindow::Redo() {
+  const bool ok = _driver->Redo();
+  SetMessage(ok ? tr("Redone") : VORQtString(_driver->LastError()));
+  _watch->Mark(VORQtChangeWatch::Document);
+  AfterStep();
+  return ok;
 }
 
 bool VORQtMainWindow::StartCommand(const QString& id) {
@@ -332,6 +233,10 @@ void VORQtMainWindow::SetMessage(const QString& text) {
 
 QString VORQtMainWindow::LastMessage() const {
   return _message->text();
+}
+
+QString VORQtMainWindow::HoverText() const {
+  return _hover->text();
 }
 
 QString VORQtMainWindow::PromptText() const {
@@ -377,11 +282,7 @@ bool VORQtMainWindow::OpenDocument(const QString& path) {
   SetMessage(tr("Opened %1").arg(QFileInfo(path).fileName()));
   AfterStep();
   // A chart opened with the document is framed once it has its size.
-  for (auto& [window, entry] : _windows) {
-    if (entry.sub)
-      if (auto* viewer = qobject_cast<VORQtViewerWidget*>(entry.sub->widget()))
-        viewer->FitAll();
-  }
+  _mirror->ForEachViewerWidget([](VORQtViewerWidget& viewer) { viewer.FitAll(); });
   return true;
 }
 
@@ -427,9 +328,18 @@ bool VORQtMainWindow::ExportChart(const QString& path, QString* error) {
     return false;
   }
   std::string reason;
-  const bool png = QFileInfo(path).suffix().compare("png", Qt::CaseInsensitive) == 0;
-  const bool ok = png ? VORQtImageExport::WritePNG(*widget->GetViewer(), path.toStdString(), reason)
-                      : VORSVGWriter::WriteFile(*widget->GetViewer(), path.toStdString(), reason);
+  const QString suffix = QFileInfo(path).suffix().toLower();
+  VORViewer& viewer = *widget->GetViewer();
+  const std::string file = path.toStdString();
+  bool ok = false;
+  if (suffix == "png")
+    ok = VORQtImageExport::WritePNG(viewer, file, reason);
+  else if (suffix == "pdf")
+    ok = VORQtPdfBook::WriteChart(
+        viewer, _mdi->activeSubWindow() ? _mdi->activeSubWindow()->windowTitle().toStdString() : "",
+        file, reason);
+  else
+    ok = VORSVGWriter::WriteFile(viewer, file, reason);
   if (!ok && error != nullptr)
     *error = VORQtString(reason);
   if (ok)
@@ -501,183 +411,65 @@ void VORQtMainWindow::UpdateWindowMenu() {
   }
 }
 
-QWidget* VORQtMainWindow::MakeWindowWidget(VORFrmWindow* window) {
-#ifdef PFV_QT_WITH_PERT
-  // The classic chart window keeps no viewer of its own: it gets the graph editor's chart of
-  // its level, drawn as the export draws it, so that it can be seen and picked in.
-  if (auto* chart = dynamic_cast<QELFpaPertChartWindow*>(window);
-      chart != nullptr && ViewerOf(window) == nullptr) {
-    auto viewer = VORHandle<QELPertViewer>::Adopt(new QELPertViewer(
-        window->GetViewerFrame(), "PERT Chart", QELPertParameters::PERT_VIEWER_STYLE, 800, 500,
-        QELPertParameters::PERT_VIEWER_FLAGS));
-    auto controller = VORHandle<QELPertController>::Adopt(
-        QELPertBuildChart(chart->GetChartRoot(), viewer, PertModeEditable));
-    if (controller) {
-      viewer->SetViewerSelectable(true);
-      window->SetViewer(viewer);
-      _windows[window].cleanup = [controller]() { controller->RemoveAllPertNodes(); };
-    }
-  }
-#endif
-  if (VORViewer* viewer = ViewerOf(window)) {
-    auto* widget = new VORQtViewerWidget(viewer);
-    widget->setObjectName(VORQtString(window->GetName()) + "Viewer");
-    return widget;
-  }
-  // A window without a 2D viewer shows what it describes to a planner.
-  auto* text = new QPlainTextEdit();
-  text->setReadOnly(true);
-  text->setPlainText(VORQtString(window->DescribeContents()));
-  return text;
-}
-
-void VORQtMainWindow::SyncWindows() {
-  VORFrmLayout* layout = VORFrmLayout::GetCurrentLayout();
-  const QRect client = _mdi->viewport()->rect();
-  layout->SetClientArea(VORRectangle{0, 0, client.width(), client.height()});
-  const std::vector<VORFrmWindow*> windows = layout->GetWindowList();
-  for (auto it = _windows.begin(); it != _windows.end();) {
-    VORFrmWindow* window = it->first;
-    const bool present = std::find(windows.begin(), windows.end(), window) != windows.end();
-    if (present && !window->IsDeleted()) {
-      ++it;
-      continue;
-    }
-    if (it->second.sub)
-      delete it->second.sub;
-    if (it->second.cleanup)
-      it->second.cleanup();
-    it = _windows.erase(it);
-  }
-  for (VORFrmWindow* window : windows) {
-    if (dynamic_cast<VORFrmTreeWindow*>(window) != nullptr || window->IsDeleted())
-      continue;
-    MdiEntry& entry = _windows[window];
-    auto* sub = static_cast<VORQtMdiWindow*>(entry.sub.data());
-    const bool hasViewer = ViewerOf(window) != nullptr;
-    if (sub == nullptr) {
-      entry.window = window;
-      sub = new VORQtMdiWindow(window);
-      sub->setWidget(MakeWindowWidget(window));
-      sub->hasViewer = ViewerOf(window) != nullptr;
-      _mdi->addSubWindow(sub);
-      sub->resize(std::max(400, _mdi->width() * 3 / 4), std::max(300, _mdi->height() * 3 / 4));
-      // The layout's MDI state says how a new window is placed.
-      if (layout->GetMDIState() == VORFrmLayout::MDIMaximized) {
-        sub->showMaximized();
-      } else {
-        sub->show();
-        if (layout->GetMDIState() == VORFrmLayout::MDITiled)
-          _mdi->tileSubWindows();
-      }
-      entry.sub = sub;
-      // A chart opens framed on its whole scene (again once the window has its final size).
-      if (auto* viewer = qobject_cast<VORQtViewerWidget*>(sub->widget())) {
-        viewer->FitAll();
-        QTimer::singleShot(0, viewer, [viewer]() { viewer->FitAll(); });
-      }
-    } else if (sub->hasViewer != hasViewer) {
-      sub->setWidget(MakeWindowWidget(window));
-      sub->hasViewer = hasViewer;
-    } else if (auto* text = qobject_cast<QPlainTextEdit*>(sub->widget())) {
-      const QString contents = VORQtString(window->DescribeContents());
-      if (text->toPlainText() != contents)
-        text->setPlainText(contents);
-    }
-    sub->setWindowTitle(VORQtString(window->GetTitle()));
-  }
-  if (auto it = _windows.find(layout->GetCurrentWindow()); it != _windows.end() && it->second.sub) {
-    if (_mdi->activeSubWindow() != it->second.sub)
-      _mdi->setActiveSubWindow(it->second.sub);
-  }
-}
-
-QString VORQtMainWindow::StateSignature() const {
-  QString s;
-  VORFrmLayout* layout = VORFrmLayout::GetCurrentLayout();
-  for (VORFrmWindow* w : layout->GetWindowList())
-    s += QString::number(reinterpret_cast<quintptr>(w), 16) + (w->IsDeleted() ? "d" : "") +
-         (ViewerOf(w) ? "v" : "") + VORQtString(w->GetTitle()) + ",";
-  s += "|" + QString::number(reinterpret_cast<quintptr>(layout->GetCurrentWindow()), 16);
-  VORFrmEditor* editor = _driver->GetEditor();
-  s += "|" + QString::number(reinterpret_cast<quintptr>(editor), 16);
-  if (editor != nullptr) {
-    for (VORSelectionSet* set : {static_cast<VORSelectionSet*>(editor->GetCSO()),
-                                 static_cast<VORSelectionSet*>(editor->GetHSO())}) {
-      s += "|" + QString::number(set->GetSize());
-      for (int i = 1; i <= std::min(set->GetSize(), 32); ++i)
-        s += ":" + QString::number(reinterpret_cast<quintptr>(set->GetElement(i)->GetLeaf()), 16);
-    }
-    if (VORProcess* document = _driver->GetDocument())
-      s += document->IsModified() ? "|m" : "|u";
-  }
-  VORCommand* running = _driver->GetRunningCommand();
-  s += "|" + QString::number(reinterpret_cast<quintptr>(running), 16);
-  if (auto* state = dynamic_cast<VORStateCommand*>(running))
-    s += ":" + QString::number(reinterpret_cast<quintptr>(state->GetCurrentState()), 16);
-  s += "|" + QString::number(VORDlgNotify::Recorder().Records().size()) + "|" +
-       QString::number(_commandsEnded);
-  return s;
-}
-
 void VORQtMainWindow::AfterStep() {
   if (_syncing || _driver == nullptr)
     return;
   _syncing = true;
+  // A drag is one step: it ends when the last button is let go.
+  if (QApplication::mouseButtons() == Qt::NoButton)
+    _driver->EndUndoStep();
   const std::vector<std::string> events = _driver->TakeEvents();
   if (!events.empty())
     SetMessage(VORQtString(events.back()));
-  const QString signature = StateSignature();
-  if (signature != _signature || !events.empty()) {
-    _signature = signature;
-    SyncWindows();
-    VORProcess* document = _driver->GetDocument();
-    if (document != _treeDocument || _commandsEnded != _treeBuiltAt) {
-      _tree->Rebuild(document);
-      _treeDocument = document;
-      _treeBuiltAt = _commandsEnded;
-    } else {
-      _tree->ShowSelection();
-    }
-    VORCommand* running = _driver->GetRunningCommand();
-    QString prompt = tr("Ready");
-    if (running != nullptr) {
-      const std::string name = running->GetName().str();
-      const VORWorkbenchCommand* known = VORWorkbench::Find(name);
-      prompt = VORQtString(known && !known->title.empty() ? known->title : name);
-      if (auto* state = dynamic_cast<VORStateCommand*>(running);
-          state != nullptr && state->GetCurrentState() != nullptr)
-        prompt += ": " + VORQtString(state->GetCurrentState()->GetName());
-    }
-    _prompt->setText(prompt);
-    QString title = tr("Product Flow Viewer");
-    if (document != nullptr) {
-      title = QFileInfo(VORQtString(document->GetStorageName())).fileName() + "[*] - " + title;
-      setWindowModified(document->IsModified());
-    }
-    setWindowTitle(title);
-    for (auto& [window, entry] : _windows) {
-      if (entry.sub)
-        if (auto* viewer = qobject_cast<VORQtViewerWidget*>(entry.sub->widget()))
-          viewer->Sync();
-    }
-  }
+  std::uint32_t changes = _watch->Take();
+  if (!events.empty())
+    changes |= VORQtChangeWatch::Layout | VORQtChangeWatch::Command;
+  if (changes != 0)
+    CatchUp(changes);
   _syncing = false;
 }
 
+void VORQtMainWindow::CatchUp(std::uint32_t changes) {
+  if ((changes &
+       (VORQtChangeWatch::Layout | VORQtChangeWatch::Selection | VORQtChangeWatch::Command)) != 0)
+    _mirror->Sync();
+  VORProcess* document = _driver->GetDocument();
+  if (document != _treeDocument || _watch->CommandsEnded() != _treeBuiltAt) {
+    _tree->Rebuild(document);
+    _treeDocument = document;
+    _treeBuiltAt = _watch->CommandsEnded();
+  } else if ((changes & VORQtChangeWatch::Selection) != 0) {
+    _tree->ShowSelection();
+  }
+  VORCommand* running = _driver->GetRunningCommand();
+  QString prompt = tr("Ready");
+  if (running != nullptr) {
+    const std::string name = running->GetName().str();
+    const VORWorkbenchCommand* known = VORWorkbench::Find(name);
+    prompt = VORQtString(known && !known->title.empty() ? known->title : name);
+    if (auto* state = dynamic_cast<VORStateCommand*>(running);
+        state != nullptr && state->GetCurrentState() != nullptr)
+      prompt += ": " + VORQtString(state->GetCurrentState()->GetName());
+  }
+  _prompt->setText(prompt);
+  QString title = tr("Product Flow Viewer");
+  if (document != nullptr) {
+    title = QFileInfo(VORQtString(document->GetStorageName())).fileName() + "[*] - " + title;
+    setWindowModified(document->IsModified());
+  }
+  setWindowTitle(title);
+  VORFrmEditor* editor = _driver->GetEditor();
+  _undo->setEnabled(editor != nullptr && editor->GetUndoStack().CanUndo());
+  _redo->setEnabled(editor != nullptr && editor->GetUndoStack().CanRedo());
+  _mirror->ForEachViewerWidget([](VORQtViewerWidget& viewer) { viewer.Sync(); });
+}
+
 VORQtViewerWidget* VORQtMainWindow::CurrentViewerWidget() const {
-  QMdiSubWindow* sub = _mdi->activeSubWindow();
-  if (sub == nullptr && !_mdi->subWindowList().isEmpty())
-    sub = _mdi->subWindowList().constLast();
-  return sub ? qobject_cast<VORQtViewerWidget*>(sub->widget()) : nullptr;
+  return _mirror->CurrentViewerWidget();
 }
 
 VORQtViewerWidget* VORQtMainWindow::ViewerWidgetOf(const QString& window) const {
-  VORFrmWindow* w = _driver->FindWindow(window.toStdString());
-  auto it = _windows.find(w);
-  if (it == _windows.end() || !it->second.sub)
-    return nullptr;
-  return qobject_cast<VORQtViewerWidget*>(it->second.sub->widget());
+  return _mirror->ViewerWidgetOf(_driver->FindWindow(window.toStdString()));
 }
 
 void VORQtMainWindow::RestoreGeometry() {

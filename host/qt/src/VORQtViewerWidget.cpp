@@ -13,6 +13,7 @@
 #include "VORDeferredDeletion.h"
 #include "VORDlgContextualMenu.h"
 #include "VORPVBalloon.h"
+#include "VORQtActivityInfo.h"
 #include "VORQtStrings.h"
 
 namespace {
@@ -131,7 +132,11 @@ VORMathPoint2D VORQtViewerWidget::PixelToModel(const QPointF& pixel) const {
 void VORQtViewerWidget::FitAll() {
   if (!_viewer)
     return;
+  // Framed on the widget's size as it is now, and again at each resize until the planner
+  // zooms or pans himself.
+  _viewer->SetGraphicSize(width(), height());
   _viewer->Reframe();
+  _keepFitted = true;
   Sync();
 }
 
@@ -271,8 +276,11 @@ void VORQtViewerWidget::paintEvent(QPaintEvent* event) {
 
 void VORQtViewerWidget::resizeEvent(QResizeEvent* event) {
   QWidget::resizeEvent(event);
-  if (_viewer)
+  if (_viewer) {
     _viewer->SetGraphicSize(width(), height());
+    if (_keepFitted)
+      _viewer->Reframe();
+  }
   Sync();
 }
 
@@ -287,6 +295,8 @@ void VORQtViewerWidget::mousePressEvent(QMouseEvent* event) {
     QWidget::mousePressEvent(event);
     return;
   }
+  if (button == VORMouseMiddle)
+    _keepFitted = false;
   _viewer->OnMousePress(event->position().x(), event->position().y(), button,
                         ModifiersOf(event->modifiers()));
   Sync();
@@ -299,6 +309,10 @@ void VORQtViewerWidget::mouseMoveEvent(QMouseEvent* event) {
   _viewer->OnMouseMove(event->position().x(), event->position().y(),
                        ModifiersOf(event->modifiers()));
   Sync();
+  if (event->buttons() == Qt::NoButton) {
+    const QPointF pixel = event->position();
+    UpdateHover(&pixel);
+  }
   event->accept();
 }
 
@@ -323,6 +337,7 @@ void VORQtViewerWidget::wheelEvent(QWheelEvent* event) {
     QWidget::wheelEvent(event);
     return;
   }
+  _keepFitted = false;
   _viewer->OnMouseWheel(event->position().x(), event->position().y(), event->angleDelta().y(),
                         ModifiersOf(event->modifiers()));
   Sync();
@@ -357,11 +372,23 @@ void VORQtViewerWidget::contextMenuEvent(QContextMenuEvent* event) {
   event->accept();
 }
 
+void VORQtViewerWidget::UpdateHover(const QPointF* pixel) {
+  VORBaseUnknown* activity = nullptr;
+  if (pixel != nullptr && _viewer)
+    activity = VORQtActivityInfo::ActivityOf(_viewer->PickPaths(pixel->x(), pixel->y()));
+  if (activity == _hovered.get())
+    return;
+  _hovered = activity;
+  setToolTip(VORQtActivityInfo::Name(activity));
+  emit hoveredActivity(VORQtActivityInfo::Summary(activity));
+}
+
 void VORQtViewerWidget::leaveEvent(QEvent* event) {
   if (_viewer) {
     _viewer->OnMouseLeave();
     Sync();
   }
+  UpdateHover(nullptr);
   QWidget::leaveEvent(event);
 }
 

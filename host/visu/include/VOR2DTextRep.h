@@ -21,6 +21,12 @@ class VOR2DTextRep : public VOR2DRep {
   int GetAnchor() const { return _anchor; }
   void SetHeight(double height);
   double GetHeight() const { return _height; }
+  // Widest the label may be drawn (model units, 0: no limit); a longer text is drawn elided,
+  // GetText() keeps it whole.
+  void SetMaxWidth(double width);
+  double GetMaxWidth() const { return _maxWidth; }
+  // The text as drawn.
+  VORUnicodeString GetShownText() const;
 
   bool HitTest(const VORMathPoint2D& p, double tolerance) const override;
 
@@ -33,5 +39,6 @@ class VOR2DTextRep : public VOR2DRep {
   VORMathPoint2Df _at;
   int _anchor;
   double _height;
+  double _maxWidth = 0.0;
 };
 VOR_DECLARE_HANDLE(VOR2DTextRep);

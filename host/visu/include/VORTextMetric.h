@@ -32,6 +32,10 @@ inline double CharacterWidth(double height) {
 //   5  end, vertically centred
 // Other codes are treated as 0.
 VORBox2D TextBox(double anchorX, double anchorY, int characterCount, double height, int anchor);
+
+// The text as drawn within maxWidth (<= 0: no limit): whole when it fits, else its first
+// characters followed by an ellipsis, as many as fit (at least the ellipsis).
+VORUnicodeString Elide(const VORUnicodeString& text, double height, double maxWidth);
 VORBox2D TextBox(double anchorX, double anchorY, const VORUnicodeString& text, double height,
                  int anchor);
 }  // namespace VORTextMetric

@@ -59,6 +59,8 @@ class VORViewer : public VORCommand {
   static constexpr const char* kRedrawEvent = "VORViewerRedraw";
   static constexpr const char* kPickEvent = "VORViewerPick";
   static constexpr double kPickTolerancePixels = 3.0;
+  // Zoom factor of one wheel notch (120 units of delta): a step a planner notices.
+  static constexpr double kWheelNotchZoom = 1.25;
   static constexpr double kDragThresholdPixels = 3.0;
 
   // parent is the dialog that holds the viewer (not held); style and flags are kept for the GUI.

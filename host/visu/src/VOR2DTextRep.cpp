@@ -29,12 +29,21 @@ void VOR2DTextRep::SetHeight(double height) {
   Invalidate();
 }
 
+void VOR2DTextRep::SetMaxWidth(double width) {
+  _maxWidth = width;
+  Invalidate();
+}
+
+VORUnicodeString VOR2DTextRep::GetShownText() const {
+  return VORTextMetric::Elide(_text, _height, _maxWidth);
+}
+
 bool VOR2DTextRep::HitTest(const VORMathPoint2D& p, double tolerance) const {
   return GetBoundingBox().Contains(p.x, p.y, tolerance);
 }
 
 VORBox2D VOR2DTextRep::ComputeBoundingBox() const {
-  return VORTextMetric::TextBox(_at.x, _at.y, _text, _height, _anchor);
+  return VORTextMetric::TextBox(_at.x, _at.y, GetShownText(), _height, _anchor);
 }
 
 void VOR2DTextRep::FlattenShown(VORFlattenContext& context) const {
@@ -42,9 +51,9 @@ void VOR2DTextRep::FlattenShown(VORFlattenContext& context) const {
     return;
   VORRenderItem& item = AddItem(context, VORPrimitiveKind::Text);
   item.points = {context.matrix.Transform(_at.x, _at.y)};
-  item.text = _text;
+  item.text = GetShownText();
   item.anchor = _anchor;
   item.textHeight = _height * context.matrix.ScaleFactor();
-  item.box =
-      VORTextMetric::TextBox(item.points[0].x, item.points[0].y, _text, item.textHeight, _anchor);
+  item.box = VORTextMetric::TextBox(item.points[0].x, item.points[0].y, item.text, item.textHeight,
+                                    _anchor);
 }

@@ -1,5 +1,7 @@
 #include "VORTextMetric.h"
 
+#include <algorithm>
+
 #include "VORUnicodeString.h"
 
 namespace VORTextMetric {
@@ -39,6 +41,16 @@ VORBox2D TextBox(double x, double y, int characterCount, double height, int anch
       break;
   }
   return VORBox2D(left, bottom, left + w, bottom + height);
+}
+
+VORUnicodeString Elide(const VORUnicodeString& text, double height, double maxWidth) {
+  const int length = text.GetLengthInChar();
+  if (maxWidth <= 0.0 || height <= 0.0 || TextWidth(length, height) <= maxWidth)
+    return text;
+  // A hair of tolerance: a width made of whole characters fits exactly.
+  const int fit = static_cast<int>(maxWidth / CharacterWidth(height) + 1e-9);
+  const int kept = std::max(fit - 1, 0);
+  return text.SubString(0, kept) + VORUnicodeString("\u2026");
 }
 
 VORBox2D TextBox(double x, double y, const VORUnicodeString& text, double height, int anchor) {

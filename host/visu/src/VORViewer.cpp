@@ -384,7 +384,7 @@ void VORViewer::OnMouseRelease(double px, double py, int button, int modifiers) 
 }
 
 void VORViewer::OnMouseWheel(double px, double py, int delta, int) {
-  _viewpoint->Zoom(std::pow(1.1, delta / 120.0), px, py);
+  _viewpoint->Zoom(std::pow(kWheelNotchZoom, delta / 120.0), px, py);
 }
 
 void VORViewer::OnContextMenu(double px, double py, int) {
