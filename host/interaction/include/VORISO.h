@@ -3,6 +3,8 @@
 // not held; a viewer removes itself before it dies.
 #pragma once
 
+#include <unordered_set>
+
 #include <vector>
 
 #include "VOREventPublisher.h"
@@ -16,7 +18,8 @@ class VORISO : public VORBaseUnknown {
   // Adds a model once; false when it is already there or null.
   bool AddElement(VORBaseUnknown* model);
   bool RemoveElement(VORBaseUnknown* model);
-  bool IsPresent(VORBaseUnknown* model) const { return _models.Locate(model) != 0; }
+  // By identity, without a scan: a chart adds several models per node.
+  bool IsPresent(VORBaseUnknown* model) const;
   const VORListValVORBaseUnknown_var& GetElements() const { return _models; }
   void Empty();
 
@@ -32,6 +35,7 @@ class VORISO : public VORBaseUnknown {
 
  private:
   VORListValVORBaseUnknown_var _models;
+  std::unordered_set<VORBaseUnknown*> _present;  // identities of _models
   std::vector<VORBaseUnknown*> _viewers;
   VORHandle<VOREventPublisher> _publisher;
 };
