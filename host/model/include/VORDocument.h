@@ -15,6 +15,7 @@
 #include "VORString.h"
 
 class VORModelDoor;
+class VORUndoHistory;
 struct VORDocumentData;
 
 class VORDocument : public virtual VORBaseUnknown {
@@ -109,6 +110,8 @@ class VORProcess : public VORDocument, public virtual VORIDocInit {
 
   // The one door for changes.
   VORModelDoor& GetDoor();
+  // The user steps made through the door, for undo and redo.
+  VORUndoHistory& GetUndoHistory();
   // True after a change through the door since the last load or save.
   bool IsModified() const;
   void SetModified(bool modified);

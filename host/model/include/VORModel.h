@@ -48,3 +48,4 @@
 #include "VORSPPLinkServices.h"
 #include "VORSPPReparentService.h"
 #include "VORShowNotif.h"
+#include "VORUndoHistory.h"

@@ -8,6 +8,7 @@
 #include <functional>
 #include <optional>
 #include <string>
+#include <type_traits>
 #include <vector>
 
 #include "VORHandle.h"
@@ -16,6 +17,7 @@
 
 class VORProcess;
 class VORModelDoor;
+struct VORDocumentData;
 
 // Inverses of the changes made while it was attached, in order. A log belongs to one document
 // and must not be replayed after that document is gone.
@@ -125,9 +127,13 @@ class VORModelDoor {
   long ChangeCount() const { return _changes; }
 
  private:
-  friend struct VORDoorAccess;
   void Record(std::function<void()> inverse);
   void Changed();
+  VORDocumentData* Data() const;
+  // The scalar setters' common body (defined with the door's private helpers).
+  template <class Impl, class Owner, class Value, class Arg>
+  HRESULT SetScalar(Impl* object, Value Owner::*field, std::type_identity_t<Arg> value,
+                    const char* what, HRESULT (VORModelDoor::*again)(VORBaseUnknown*, Arg));
 
   VORProcess* _document;
   VORChangeLog* _recorder = nullptr;

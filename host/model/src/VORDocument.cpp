@@ -4,6 +4,7 @@
 #include <algorithm>
 
 #include "VORLateTypes.h"
+#include "VORModelDoorDetail.h"
 #include "VORModelObjects.h"
 
 // ---------------------------------------------------------------- document data
@@ -60,30 +61,13 @@ VORModelObject* VORDocumentData::Find(const std::string& id) const {
   return it == ids.end() ? nullptr : it->second;
 }
 
-namespace {
-void CollectNodes(VORGraphNodeImpl* n, std::vector<VORModelObject*>& out) {
-  out.push_back(n);
-  if (VORActivityImpl* a = n->AsActivity()) {
-    for (auto& io : a->productIOs)
-      out.push_back(io.get());
-    for (auto& c : a->children)
-      CollectNodes(c.get(), out);
-  }
-}
-void CollectProducts(VORProductImpl* p, std::vector<VORModelObject*>& out) {
-  out.push_back(p);
-  for (auto& c : p->children)
-    CollectProducts(c.get(), out);
-}
-}  // namespace
-
 std::vector<VORModelObject*> VORDocumentData::AllObjects() const {
   std::vector<VORModelObject*> all;
   all.reserve(ids.size());
   if (root)
-    CollectNodes(root.get(), all);
+    VORDoorDetail::CollectSubtree(root.get(), all);
   for (auto& p : rootProducts)
-    CollectProducts(p.get(), all);
+    VORDoorDetail::CollectProducts(p.get(), all);
   for (auto& m : assemblies)
     all.push_back(m.get());
   for (auto& t : planTypes)
@@ -463,6 +447,10 @@ VORProcessStatistics VORProcess::GetStatistics() {
     }
   }
   return s;
+}
+
+VORUndoHistory& VORProcess::GetUndoHistory() {
+  return _data->history;
 }
 
 VORModelDoor& VORProcess::GetDoor() {

@@ -452,6 +452,7 @@ struct VORDocumentData {
 
   VORProcess* document;
   VORModelDoor door;
+  VORUndoHistory history{door};
   std::string environment;
   VORHandle<VORContainerImpl> pprContainer;
   VORHandle<VORContainerImpl> bomContainer;
