@@ -420,6 +420,11 @@ void QELFpaProductFlowViewer::ContextMenuFor3DWindow(VORNotification* notificati
     layout->SetCurrentWindow(examined != nullptr ? examined : previous);
   }
   AddHostItem(notification, "Properties");
+  // The grouping commands on the activities they work on; the picked one is their first pick.
+  if (IsKindOf(object, "BIWActivityStation") || IsKindOf(object, "BIWActivityGrouping"))
+    AddWorkbenchItem(notification, "QELFpaPertGrpActCmd");
+  if (IsKindOf(object, "BIWActivityGrouping"))
+    AddWorkbenchItem(notification, "QELFpaPertUngroupActCmd");
   if (IsKindOf(object, "ASMPRODUCT"))
     AddPreviewWindowItem(notification);
   // A selected activity with ZitBlts: hide and show them by name.

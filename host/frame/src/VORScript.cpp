@@ -5,12 +5,61 @@
 #include <map>
 #include <sstream>
 
+#include "VORDlgCombo.h"
 #include "VORDriver.h"
 #include "VORFileIO.h"
 #include "VORModelChecker.h"
+#include "VORUndoHistory.h"
 #include "VORWorkbench.h"
 
 namespace {
+// The dialog's description with OK's availability at the end of its first line.
+std::string DialogWithOKState(const VORDriver& driver, const std::string& name) {
+  std::string text = driver.DescribeDialog(name);
+  const VORDlgDialog* dialog = driver.FindDialog(name);
+  if (dialog == nullptr || !dialog->HasOKButton())
+    return text;
+  const size_t end = text.find('\n');
+  text.insert(end == std::string::npos ? text.size() : end,
+              dialog->GetOKSensitivity() ? " [OK sensitive]" : " [OK insensitive]");
+  return text;
+}
+
+// One line per combo line: '  line <n> "<text>"', the selected one marked.
+bool PrintCombo(const VORDriver& driver, const std::string& dialogName, const std::string& name,
+                std::ostream& out, std::string& error) {
+  const VORDlgDialog* dialog = driver.FindDialog(dialogName);
+  const auto* combo =
+      dialog ? dynamic_cast<const VORDlgCombo*>(dialog->FindControl(name)) : nullptr;
+  if (combo == nullptr) {
+    error = dialog ? "no combo \"" + name + "\" in dialog \"" + dialogName + "\""
+                   : "no dialog \"" + dialogName + "\" is shown";
+    return false;
+  }
+  for (int i = 0; i < combo->GetLineCount(); ++i)
+    out << "  line " << i + 1 << " \"" << combo->GetLine(i).ConvertToUTF8() << "\""
+        << (i == combo->GetSelect() ? " [selected]" : "") << "\n";
+  return true;
+}
+
+// Undoes or redoes the newest user step of the current document: 'undone "<step>"'.
+bool UndoOrRedo(VORDriver& driver, bool undo, std::ostream& out, std::string& error) {
+  VORProcess* document = driver.GetDocument();
+  if (document == nullptr) {
+    error = "no document is open";
+    return false;
+  }
+  VORUndoHistory& history = document->GetUndoHistory();
+  const std::string name = undo ? history.UndoName() : history.RedoName();
+  if (!(undo ? history.Undo() : history.Redo())) {
+    error = undo ? "nothing to undo" : "nothing to redo";
+    return false;
+  }
+  driver.DrainDeferred();
+  out << (undo ? "undone \"" : "redone \"") << name << "\"\n";
+  return true;
+}
+
 bool ToNumber(const std::string& word, double& value) {
   char* end = nullptr;
   value = std::strtod(word.c_str(), &end);
@@ -212,6 +261,11 @@ bool VORScript::Execute(const std::vector<std::string>& w, std::string& error) {
   if (step == "toggle")
     return args(2, 2, "toggle <dialog> <check button>") &&
            driverStep(_driver.ToggleCheckButton(w[1], w[2]));
+  if (step == "undo" || step == "redo") {
+    if (!args(0, 0, step == "undo" ? "undo" : "redo"))
+      return false;
+    return UndoOrRedo(_driver, step == "undo", _out, error);
+  }
   if (step == "activate")
     return args(1, 1, "activate <window>") && driverStep(_driver.ActivateWindow(w[1]));
   if (step == "close-window")
@@ -222,7 +276,7 @@ bool VORScript::Execute(const std::vector<std::string>& w, std::string& error) {
       if (auto found = ModuleSteps().find("print " + w[1]); found != ModuleSteps().end())
         return found->second(_driver, w, _out, error);
     }
-    if (!args(1, 2, "print windows|window [w]|cso|dialog [d]|menu|commands|check"))
+    if (!args(1, 3, "print windows|window [w]|cso|dialog [d]|combo <d> <c>|menu|commands|check"))
       return false;
     const std::string& what = w[1];
     if (what == "windows") {
@@ -232,7 +286,11 @@ bool VORScript::Execute(const std::vector<std::string>& w, std::string& error) {
     } else if (what == "cso") {
       _out << _driver.DescribeCSO();
     } else if (what == "dialog") {
-      _out << _driver.DescribeDialog(arg(2));
+      _out << DialogWithOKState(_driver, arg(2));
+    } else if (what == "combo") {
+      if (!args(3, 3, "print combo <dialog> <combo>"))
+        return false;
+      return PrintCombo(_driver, w[2], w[3], _out, error);
     } else if (what == "menu") {
       _out << _driver.DescribeMenu();
     } else if (what == "commands") {

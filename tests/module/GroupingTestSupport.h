@@ -1,0 +1,167 @@
+// A fixture for the grouping commands: a level built through the model's door, saved and opened
+// through the headless driver, with helpers that read the result through the interfaces.
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include <string>
+#include <vector>
+
+#include "TempDir.h"
+#include "VORDlgNotify.h"
+#include "VORDocument.h"
+#include "VORDriver.h"
+#include "VORIGraphNodeLayout.h"
+#include "VORIProduct.h"
+#include "VORISPPAbstractActivity.h"
+#include "VORISPPChildManagement.h"
+#include "VORISPPFlowMgt.h"
+#include "VORISPPResourceManagement.h"
+#include "VORIGENode.h"
+#include "VORModelDoor.h"
+#include "VORUndoHistory.h"
+
+class GroupingTest : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line", hub ? "IPDDocEnv" : ""));
+    root = doc->GetRootProcess();
+  }
+
+  VORModelDoor& Door() { return doc->GetDoor(); }
+
+  VORBaseUnknown_var Node(VORBaseUnknown* father, const char* label,
+                          const char* type = "BIWActivityStation", double x = 0, double y = 0) {
+    VORBaseUnknown_var node;
+    EXPECT_EQ(Door().CreateNode(father, type, node), S_OK);
+    Door().SetLabel(node, VORUnicodeString(label));
+    Door().SetPertPosition(node, true, x, y);
+    return node;
+  }
+  void Flow(const VORBaseUnknown_var& from, const VORBaseUnknown_var& to) {
+    EXPECT_EQ(Door().AddFlow(from, to), S_OK);
+  }
+  VORBaseUnknown_var Product(VORBaseUnknown* father, const char* name) {
+    VORBaseUnknown_var product;
+    EXPECT_EQ(Door().CreateProduct(father, VORUnicodeString(name), product), S_OK);
+    return product;
+  }
+  VORBaseUnknown_var Resource(VORBaseUnknown* father, const char* name, const char* planType = "") {
+    VORBaseUnknown_var r = Product(father, name);
+    EXPECT_EQ(Door().MakeResource(r, VORUnicodeString("Resource"), VORUnicodeString(planType)),
+              S_OK);
+    return r;
+  }
+  // Saves the document built so far and opens it through the driver.
+  void Open() {
+    std::string error;
+    const std::string file = dir.Path() + "/line.pprx";
+    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
+    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
+    doc = driver.GetDocument();
+    root = doc->GetRootProcess();
+    driver.TakeEvents();
+    ForgetMessages();
+  }
+  VORBaseUnknown* Find(const char* label) const { return driver.FindObject(label); }
+
+  // Starts the command and picks the labels in the tree, in order.
+  void StartAndPick(const char* command, const std::vector<const char*>& labels) {
+    ASSERT_TRUE(driver.StartCommand(command)) << driver.LastError();
+    for (const char* label : labels)
+      driver.PickObject(label);
+  }
+
+  static std::string Label(VORBaseUnknown* node) {
+    VORUnicodeString label;
+    if (VORIGENode_var n(node); n)
+      n->GetLabel(label);
+    return label.ConvertToUTF8();
+  }
+  static std::string Labels(VORListValVORBaseUnknown_var* list) {
+    std::string text;
+    if (list != nullptr) {
+      for (const VORBaseUnknown_var& o : *list)
+        text += (text.empty() ? "" : " ") + Label(o);
+    }
+    delete list;
+    return text;
+  }
+  // Every child of an activity, control nodes too, in order.
+  static std::string Children(VORBaseUnknown* activity) {
+    VORListValVORBaseUnknown_var* list = nullptr;
+    VORISPPChildManagement_var(activity)->GetChildren(list);
+    return Labels(list);
+  }
+  // Next nodes of node, control nodes too.
+  static std::string Next(VORBaseUnknown* node) {
+    VORListValVORBaseUnknown_var* list = nullptr;
+    VORISPPFlowMgt_var(node)->GetNextActivities(list, "");
+    return Labels(list);
+  }
+  static std::string Previous(VORBaseUnknown* node) {
+    VORListValVORBaseUnknown_var* list = nullptr;
+    VORISPPFlowMgt_var(node)->GetPreviousActivities(list, "");
+    return Labels(list);
+  }
+  static std::string ProductName(VORBaseUnknown* product) {
+    VORUnicodeString name;
+    if (VORIProduct_var p(product); p)
+      p->GetPartNumber(name);
+    return name.ConvertToUTF8();
+  }
+  static std::string ChildProducts(VORBaseUnknown* product) {
+    VORListValVORBaseUnknown_var* list = nullptr;
+    VORIProduct_var(product)->GetChildren(list);
+    std::string text;
+    for (const VORBaseUnknown_var& p : *list)
+      text += (text.empty() ? "" : " ") + ProductName(p);
+    delete list;
+    return text;
+  }
+  static std::string ResourceNames(VORBaseUnknown* activity) {
+    VORListValVORBaseUnknown_var* list = nullptr;
+    VORISPPResourceManagement_var(activity)->GetResources(list);
+    std::string text;
+    for (const VORBaseUnknown_var& p : *list)
+      text += (text.empty() ? "" : " ") + ProductName(p);
+    delete list;
+    return text;
+  }
+  // The child of an activity with that label (null when none).
+  static VORBaseUnknown_var ChildNamed(VORBaseUnknown* activity, const std::string& label) {
+    VORListValVORBaseUnknown_var* list = nullptr;
+    VORISPPChildManagement_var(activity)->GetChildren(list);
+    VORBaseUnknown_var found;
+    for (const VORBaseUnknown_var& c : *list) {
+      if (Label(c) == label)
+        found = c;
+    }
+    delete list;
+    return found;
+  }
+  // Texts of the notifications shown since the last call.
+  std::vector<std::string> Messages() {
+    std::vector<std::string> texts;
+    const auto& records = VORDlgNotify::Recorder().Records();
+    for (size_t i = _seen; i < records.size(); ++i)
+      texts.push_back(records[i].title + ": " + records[i].text);
+    _seen = records.size();
+    return texts;
+  }
+  void ForgetMessages() { Messages(); }
+  // The last driver event since the previous call ("" when none).
+  std::string LastEvent() {
+    const std::vector<std::string> events = driver.TakeEvents();
+    return events.empty() ? std::string() : events.back();
+  }
+
+  bool hub = false;
+  TempDir dir;
+  VORDriver driver;
+  VORProcess_var doc;
+  VORBaseUnknown_var root;
+
+ private:
+  size_t _seen = 0;
+};
