@@ -19,7 +19,6 @@
 #include "VORISPPResourceManagement.h"
 #include "VORIGENode.h"
 #include "VORModelDoor.h"
-#include "VORUndoHistory.h"
 
 class GroupingTest : public ::testing::Test {
  protected:

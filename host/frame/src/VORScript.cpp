@@ -9,7 +9,6 @@
 #include "VORDriver.h"
 #include "VORFileIO.h"
 #include "VORModelChecker.h"
-#include "VORUndoHistory.h"
 #include "VORWorkbench.h"
 
 namespace {
@@ -39,24 +38,6 @@ bool PrintCombo(const VORDriver& driver, const std::string& dialogName, const st
   for (int i = 0; i < combo->GetLineCount(); ++i)
     out << "  line " << i + 1 << " \"" << combo->GetLine(i).ConvertToUTF8() << "\""
         << (i == combo->GetSelect() ? " [selected]" : "") << "\n";
-  return true;
-}
-
-// Undoes or redoes the newest user step of the current document: 'undone "<step>"'.
-bool UndoOrRedo(VORDriver& driver, bool undo, std::ostream& out, std::string& error) {
-  VORProcess* document = driver.GetDocument();
-  if (document == nullptr) {
-    error = "no document is open";
-    return false;
-  }
-  VORUndoHistory& history = document->GetUndoHistory();
-  const std::string name = undo ? history.UndoName() : history.RedoName();
-  if (!(undo ? history.Undo() : history.Redo())) {
-    error = undo ? "nothing to undo" : "nothing to redo";
-    return false;
-  }
-  driver.DrainDeferred();
-  out << (undo ? "undone \"" : "redone \"") << name << "\"\n";
   return true;
 }
 
@@ -261,11 +242,6 @@ bool VORScript::Execute(const std::vector<std::string>& w, std::string& error) {
   if (step == "toggle")
     return args(2, 2, "toggle <dialog> <check button>") &&
            driverStep(_driver.ToggleCheckButton(w[1], w[2]));
-  if (step == "undo" || step == "redo") {
-    if (!args(0, 0, step == "undo" ? "undo" : "redo"))
-      return false;
-    return UndoOrRedo(_driver, step == "undo", _out, error);
-  }
   if (step == "activate")
     return args(1, 1, "activate <window>") && driverStep(_driver.ActivateWindow(w[1]));
   if (step == "close-window")

@@ -1,6 +1,8 @@
 // A document's user steps, undone and redone whole. A step collects every change made through
 // the model's door between Begin and End; a Begin inside an open step joins it, so a command
-// built from other commands' operations is still one step. Owned by the document.
+// built from other commands' operations is still one step, and Abandon takes a refused step
+// back. When a recorder was already attached at Begin (the window's undo stack), End hands the
+// step to it instead of keeping it here. Owned by the document.
 #pragma once
 
 #include <string>

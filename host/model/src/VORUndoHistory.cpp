@@ -14,9 +14,17 @@ void VORUndoHistory::End() {
   if (_depth == 0 || --_depth > 0)
     return;
   _door.SetRecorder(_outer);
+  VORChangeLog* outer = _outer;
   _outer = nullptr;
   if (_open.log.IsEmpty())
     return;
+  if (outer != nullptr) {
+    // Someone records around this step (the window's undo stack): the step joins its log, so
+    // the user undoes it there, as one step with the command that made it.
+    outer->Append(std::move(_open.log));
+    _open = Step();
+    return;
+  }
   _undo.push_back(std::move(_open));
   _open = Step();
   _redo.clear();
