@@ -103,4 +103,53 @@ TEST(EventPublisherTest, RemovingManyCallbacksOneByOneKeepsTheOthersInOrder) {
   EXPECT_EQ(p->CallbackCount(), 49);
 }
 
+TEST(EventPublisherTest, KeyedDispatchReachesItsKeyAndTheUnkeyedInRegistrationOrder) {
+  auto p = VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
+  Recorder r;
+  int a = 0, b = 0, c = 0;
+  p->AddKeyedCallback(&a, "E", r.Callback("a1"));
+  p->AddCallback("E", r.Callback("all"));
+  p->AddKeyedCallback(&b, "E", r.Callback("b1"));
+  p->AddKeyedCallback(&a, "ActivityChanged", r.Callback("a-kind"));
+  p->AddKeyedCallback(&a, "Other", r.Callback("a-other"));
+  EXPECT_EQ(p->AddKeyedCallback(nullptr, "E", r.Callback("x")), 0u);
+  EXPECT_EQ(p->KeyedCallbackCount(&a, "E"), 1);
+  EXPECT_EQ(p->KeyedCallbackCount(&c, "E"), 0);
+
+  VORHandle<ChildAdded> added = VORHandle<ChildAdded>::Adopt(new ChildAdded());
+  EXPECT_EQ(p->DispatchKeyed(&a, "E", added), 3);
+  EXPECT_EQ(p->DispatchKeyed(&c, "E", added), 1);
+  EXPECT_EQ(p->Dispatch("E", added), 4);  // without key: every matching callback
+  EXPECT_EQ(r.calls, (std::vector<std::string>{"a1:E", "all:E", "a-kind:E", "all:E", "a1:E",
+                                               "all:E", "b1:E", "a-kind:E"}));
+}
+
+TEST(EventPublisherTest, KeyedCallbacksRemovedDuringADispatchAreNotCalled) {
+  auto p = VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
+  Recorder r;
+  int a = 0, b = 0, tag = 0;
+  VORCallbackId laterOfA = 0, ofB = 0;
+  p->AddKeyedCallback(
+      &a, "E",
+      [&](VORBaseUnknown*, const std::string&, VORNotification*, void*, VORCallbackId self) {
+        r.calls.push_back("first");
+        EXPECT_TRUE(p->RemoveCallback(laterOfA));
+        EXPECT_TRUE(p->RemoveCallback(ofB));
+        EXPECT_TRUE(p->RemoveCallback(self));
+        p->AddKeyedCallback(&a, "E", r.Callback("late"), nullptr, &tag);
+      });
+  laterOfA = p->AddKeyedCallback(&a, "E", r.Callback("second"));
+  ofB = p->AddKeyedCallback(&b, "E", r.Callback("b"));
+  EXPECT_EQ(p->Dispatch("E"), 1);
+  EXPECT_EQ(r.calls, std::vector<std::string>{"first"});
+  EXPECT_EQ(p->KeyedCallbackCount(&a, "E"), 1);
+  EXPECT_EQ(p->DispatchKeyed(&b, "E"), 0);
+  EXPECT_EQ(p->DispatchKeyed(&a, "E"), 1);
+  EXPECT_EQ(r.calls.back(), "late:E");
+  EXPECT_EQ(p->RemoveCallbacksOf(&tag), 1);
+  EXPECT_EQ(p->KeyedCallbackCount(&a, "E"), 0);
+  EXPECT_EQ(p->CallbackCount(), 0);
+  EXPECT_EQ(p->DispatchKeyed(&a, "E"), 0);
+}
+
 }  // namespace

@@ -399,4 +399,103 @@ TEST_F(ZitBltManagerTest, MissingConfigurationGivesNoZitBltsUntilTheFileAppears)
   EXPECT_EQ(Names(station).size(), 15u);
 }
 
+// Changes are dispatched on the root keyed by the activity whose children changed; every
+// subscriber also hears a dispatch without key. Both must leave the same trace.
+TEST_F(ZitBltManagerTest, KeyedChangesReachOneSubscriberAndMuteAsABroadcastWould) {
+  const char* views = VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE();
+  VOREventPublisher* publisher = VORISPPActivityModificationEvents_var(root)->GetEventPublisher();
+  QELIZitBltCBSubscriber_var subscriber(station);
+  QELIUpdateManufAssly_var update(root);
+  struct Trace {
+    std::vector<std::string> log;
+    bool suspended;
+    bool operator==(const Trace&) const = default;
+  };
+  auto run = [&](bool keyed, VORBaseUnknown* father, bool muted, bool assemblyUpdate) {
+    log->clear();
+    subscriber->SetCallbacksSuspended(muted);
+    update->SetUpdateInProgress(assemblyUpdate);
+    auto n = VORHandle<VORSPPActivityNotification>::Adopt(
+        new VORSPPActivityNotification(father, loading, SPPItemAssigned));
+    if (keyed)
+      publisher->DispatchKeyed(VORBaseUnknown_var(father).Identity(), views, n);
+    else
+      publisher->Dispatch(views, n);
+    Trace t{*log, subscriber->AreCallbacksSuspended()};
+    update->SetUpdateInProgress(false);
+    subscriber->SetCallbacksSuspended(false);
+    return t;
+  };
+  auto compareAll = [&](const char* setting) {
+    for (VORBaseUnknown* father : {station.get(), grouping.get(), loading.get(), root.get()})
+      for (bool muted : {false, true})
+        for (bool assemblyUpdate : {false, true})
+          EXPECT_EQ(run(true, father, muted, assemblyUpdate),
+                    run(false, father, muted, assemblyUpdate))
+              << setting << ", muted " << muted << ", assembly update " << assemblyUpdate;
+  };
+
+  Manager(station)->BuildZitBltReps(viewer);
+  compareAll("the station alone");
+  // Alone on the level, the station's subscriber restores the mute after its own change...
+  EXPECT_EQ(run(true, station, true, true).suspended, true);
+  EXPECT_FALSE(run(true, station, true, true).log.empty());
+  // ...but the station's subscriber, which a change of another activity no longer reaches, would
+  // have left it cleared: so is it.
+  EXPECT_FALSE(run(true, grouping, true, true).suspended);
+  EXPECT_TRUE(run(true, grouping, true, false).suspended);
+
+  Manager(grouping)->BuildZitBltReps(viewer);
+  Manager(loading)->BuildZitBltReps(viewer);
+  compareAll("three activities");
+  EXPECT_EQ(publisher->KeyedCallbackCount(station.Identity(), views), 1);
+  // The other subscribers heard of another activity's change: the mute is left cleared.
+  Trace t = run(true, station, true, true);
+  EXPECT_FALSE(t.suspended);
+  EXPECT_EQ(t.log.front(), "S/BIWStationStatusBars/none");
+  EXPECT_FALSE(run(true, root, true, true).suspended);
+  EXPECT_TRUE(run(true, root, true, false).suspended);
+
+  Manager(grouping)->RemoveZitBlts();
+  Manager(loading)->RemoveZitBlts();
+  compareAll("the station alone again");
+  EXPECT_TRUE(run(true, station, true, true).suspended);
+  Manager(station)->RemoveZitBlts();
+  EXPECT_EQ(publisher->CallbackCount(), 0) << "the level's callbacks go with its last subscriber";
+}
+
+TEST_F(ZitBltManagerTest, AModelChangeCostsTheSameCallbacksHoweverManyActivitiesListen) {
+  VORModelDoor& door = doc->GetDoor();
+  VORBaseUnknown_var first, second;
+  ASSERT_EQ(door.CreateProduct(doc->GetRootProduct(), "Floor", first), S_OK);
+  ASSERT_EQ(door.CreateProduct(doc->GetRootProduct(), "Roof", second), S_OK);
+  Manager(station)->BuildZitBltReps(viewer);
+  auto assign = [&](VORBaseUnknown* item) {
+    log->clear();
+    const unsigned long long before = VOREventPublisher::CallbacksRun();
+    EXPECT_EQ(door.AssignItem(station, item), S_OK);
+    return VOREventPublisher::CallbacksRun() - before;
+  };
+  const unsigned long long alone = assign(first);
+  EXPECT_EQ(log->front(), "S/BIWStationStatusBars/none");
+  Manager(grouping)->BuildZitBltReps(viewer);
+  Manager(loading)->BuildZitBltReps(viewer);
+  EXPECT_EQ(assign(second), alone);
+
+  // A list command's own callback is filed under its owner as well.
+  QELBaseListZitBltCmd* command = nullptr;
+  ASSERT_EQ(QELIZitBltCBSubscriber_var(grouping)->GetUpdateCommand("ProductInput", &command), S_OK);
+  command->AddCallBacks();
+  const char* views = VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE();
+  VOREventPublisher* publisher = VORISPPActivityModificationEvents_var(root)->GetEventPublisher();
+  EXPECT_EQ(publisher->KeyedCallbackCount(grouping.Identity(), views), 2);
+  EXPECT_EQ(door.UnassignItem(station, second), S_OK);
+  EXPECT_FALSE(log->empty());
+  for (const std::string& line : *log)
+    EXPECT_NE(line, "G/ProductInput/none") << "the grouping's command heard the station's change";
+  EXPECT_TRUE(command->RemoveCallbacks());
+  EXPECT_FALSE(command->RemoveCallbacks());
+  EXPECT_EQ(publisher->KeyedCallbackCount(grouping.Identity(), views), 1);
+}
+
 }  // namespace

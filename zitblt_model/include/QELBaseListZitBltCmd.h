@@ -38,7 +38,8 @@ class QELBaseListZitBltCmd : public VORCommand {
 
   // The root process of the owner's tree (one reference for the caller), or E_FAIL.
   HRESULT GetRootActivity(VORISPPActivity** root);
-  // Registers OnActivityCallback on the root activity's views-change event (once).
+  // Registers OnActivityCallback on the root activity's views-change event (once), filed under
+  // the owner: changes of other activities' children do not reach it.
   void AddCallBacks();
   // False when no callback was registered.
   bool RemoveCallbacks();

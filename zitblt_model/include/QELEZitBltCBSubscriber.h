@@ -42,4 +42,5 @@ class QELEZitBltCBSubscriber : public VORExtension, public QELIZitBltCBSubscribe
   VORCallbackId _callbackHandle = 0;
   VORHandle<VOREventPublisher> _publisher;  // the root activity's, while a callback is held
   VORBaseUnknown* _root = nullptr;          // not held: only used in the callback
+  const void* _key = nullptr;               // the activity the callback is filed under
 };

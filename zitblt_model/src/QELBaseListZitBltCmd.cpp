@@ -113,7 +113,7 @@ HRESULT QELBaseListZitBltCmd::GetRootActivity(VORISPPActivity** root) {
 }
 
 void QELBaseListZitBltCmd::AddCallBacks() {
-  if (_callbackHandle != -1)
+  if (_callbackHandle != -1 || !_owner)
     return;
   VORISPPActivity* root = nullptr;
   if (FAILED(GetRootActivity(&root)))
@@ -123,8 +123,9 @@ void QELBaseListZitBltCmd::AddCallBacks() {
   if (!events || events->GetEventPublisher() == nullptr)
     return;
   _callbackPublisher = events->GetEventPublisher();
-  _callbackHandle = static_cast<int>(_callbackPublisher->AddCallback(
-      VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(),
+  // Filed under the owner: only changes of the owner's children reach this command.
+  _callbackHandle = static_cast<int>(_callbackPublisher->AddKeyedCallback(
+      _owner->GetIdentity(), VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(),
       [this](VORBaseUnknown*, const std::string& event, VORNotification* n, void* data,
              VORCallbackId id) {
         OnActivityCallback(event.c_str(), data, n, nullptr, static_cast<int>(id));

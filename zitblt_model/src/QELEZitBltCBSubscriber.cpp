@@ -1,5 +1,7 @@
 #include "QELEZitBltCBSubscriber.h"
 
+#include <unordered_map>
+
 #include "QELBaseListZitBltCmd.h"
 #include "QELIUpdateManufAssly.h"
 #include "QELIZitBltMgr.h"
@@ -16,6 +18,60 @@ bool callbacksSuspended = false;
 
 VORString Narrow(const VORUnicodeString& s) {
   return VORString(s.ConvertToUTF8().c_str());
+}
+
+// The subscribers listening on one root publisher. Their callbacks are filed under their own
+// activity, so a change under one activity reaches its subscriber only. A subscriber that hears
+// another activity's change during an assembly update leaves the callbacks-suspended flag
+// cleared; the level's stand-in callback does that for all the subscribers it skipped.
+struct Level {
+  VORCallbackId standIn = 0;
+  VORBaseUnknown* root = nullptr;                   // not held, as each subscriber's
+  std::unordered_map<const void*, int> activities;  // listening activity -> subscribers
+};
+std::unordered_map<const VOREventPublisher*, Level>& Levels() {
+  static std::unordered_map<const VOREventPublisher*, Level> levels;
+  return levels;
+}
+
+void StandForSkippedSubscribers(const VOREventPublisher* publisher, VORNotification* n) {
+  auto level = Levels().find(publisher);
+  auto* change = dynamic_cast<VORSPPActivityNotification*>(n);
+  if (level == Levels().end() || change == nullptr || change->GetFather() == nullptr)
+    return;
+  QELIUpdateManufAssly_var update{VORBaseUnknown_var(level->second.root)};
+  if (!update || !update->IsUpdateInProgress())
+    return;
+  const auto& listening = level->second.activities;
+  const size_t fatherListens = listening.count(change->GetFather()->GetIdentity());
+  if (listening.size() > fatherListens)
+    callbacksSuspended = false;
+}
+
+void JoinLevel(VOREventPublisher* publisher, VORBaseUnknown* root, const void* activity) {
+  Level& level = Levels()[publisher];
+  level.root = root;
+  if (level.standIn == 0)
+    level.standIn = publisher->AddCallback(
+        VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(),
+        [](VORBaseUnknown*, const std::string&, VORNotification* n, void* self, VORCallbackId) {
+          StandForSkippedSubscribers(static_cast<VOREventPublisher*>(self), n);
+        },
+        publisher);
+  ++level.activities[activity];
+}
+
+void LeaveLevel(VOREventPublisher* publisher, const void* activity) {
+  auto level = Levels().find(publisher);
+  if (level == Levels().end())
+    return;
+  auto& listening = level->second.activities;
+  if (auto it = listening.find(activity); it != listening.end() && --it->second == 0)
+    listening.erase(it);
+  if (listening.empty()) {
+    publisher->RemoveCallback(level->second.standIn);
+    Levels().erase(level);
+  }
 }
 }  // namespace
 
@@ -52,8 +108,10 @@ HRESULT QELEZitBltCBSubscriber::Subscribe() {
       events && events->GetEventPublisher() != nullptr && _callbackHandle == 0) {
     _publisher = events->GetEventPublisher();
     _root = root.Identity();
-    _callbackHandle = _publisher->AddCallback(
-        VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(),
+    _key = activity->GetIdentity();
+    JoinLevel(_publisher.get(), _root, _key);
+    _callbackHandle = _publisher->AddKeyedCallback(
+        _key, VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(),
         [this](VORBaseUnknown*, const std::string& event, VORNotification* n, void* data,
                VORCallbackId id) { OnViewsChange(event, n, data, id); },
         nullptr, this);
@@ -101,11 +159,14 @@ void QELEZitBltCBSubscriber::CreateUpdateCommands() {
 }
 
 void QELEZitBltCBSubscriber::DropCallback() {
-  if (_callbackHandle != 0 && _publisher)
+  if (_callbackHandle != 0 && _publisher) {
     _publisher->RemoveCallback(_callbackHandle);
+    LeaveLevel(_publisher.get(), _key);
+  }
   _callbackHandle = 0;
   _publisher = NULL_var;
   _root = nullptr;
+  _key = nullptr;
 }
 
 HRESULT QELEZitBltCBSubscriber::Unsubscribe() {

@@ -2,10 +2,18 @@
 // A callback registered for a name fires for events of that name and for notifications whose
 // class IsAKindOf that name. Callbacks added or removed during a dispatch take effect at once:
 // a removed one is not called, an added one waits for the next dispatch.
+//
+// Callbacks are filed by name, so a dispatch visits only the callbacks of its event and of the
+// notification's classes. A callback may also be filed under a key (an object identity): a
+// keyed dispatch reaches the callbacks without key and those of its key only, so a change to one
+// object does not visit the listeners of every other; a dispatch without key reaches them all.
 #pragma once
 
 #include <functional>
+#include <memory>
 #include <string>
+#include <string_view>
+#include <unordered_map>
 #include <vector>
 
 #include "VORNotification.h"
@@ -21,11 +29,16 @@ class VOREventPublisher : public VORBaseUnknown {
   VOR_DECLARE_CLASS(VOREventPublisher, VORBaseUnknown)
  public:
   // owner is passed to callbacks as the publisher (defaults to the publisher itself); not held.
-  explicit VOREventPublisher(VORBaseUnknown* owner = nullptr) : _owner(owner) {}
+  explicit VOREventPublisher(VORBaseUnknown* owner = nullptr);
+  ~VOREventPublisher() override;
 
   // subscriber is only a tag for RemoveCallbacksOf. Returns a process-wide unique id (> 0).
   VORCallbackId AddCallback(const std::string& name, VORCallbackFunction callback,
                             void* clientData = nullptr, const void* subscriber = nullptr);
+  // As AddCallback, but reached by keyed dispatches only when they carry this key (non-null).
+  VORCallbackId AddKeyedCallback(const void* key, const std::string& name,
+                                 VORCallbackFunction callback, void* clientData = nullptr,
+                                 const void* subscriber = nullptr);
   // False when no callback of this publisher has that id.
   bool RemoveCallback(VORCallbackId id);
   int RemoveCallbacksOf(const void* subscriber);
@@ -34,22 +47,34 @@ class VOREventPublisher : public VORBaseUnknown {
   int Dispatch(const std::string& event, VORNotification* notification = nullptr);
   // Dispatch under the notification's class name.
   int Dispatch(VORNotification* notification);
+  // As Dispatch, but keyed callbacks run only when filed under key.
+  int DispatchKeyed(const void* key, const std::string& event,
+                    VORNotification* notification = nullptr);
 
   int CallbackCount() const;
   bool HasCallback(VORCallbackId id) const;
+  // Callbacks filed under key for name (for the index's own checks and tests).
+  int KeyedCallbackCount(const void* key, const std::string& name) const;
+  // Callbacks run by all publishers since the process started: tests count what one change
+  // reaches by the difference.
+  static unsigned long long CallbacksRun();
 
  private:
-  struct Entry {
-    VORCallbackId id;
-    std::string name;
-    VORCallbackFunction callback;
-    void* clientData;
-    const void* subscriber;
-    bool removed;
+  struct Entry;
+  struct Channel;
+  using EntryPtr = std::shared_ptr<Entry>;
+  struct NameHash {
+    using is_transparent = void;
+    size_t operator()(std::string_view s) const { return std::hash<std::string_view>{}(s); }
   };
-  std::vector<Entry> _entries;
+
+  VORCallbackId Add(const void* key, const std::string& name, VORCallbackFunction callback,
+                    void* clientData, const void* subscriber);
+  void Forget(const EntryPtr& entry);
+  Channel* Find(std::string_view name) const;
+  int Run(const std::string& event, VORNotification* notification, bool keyed, const void* key);
+
+  std::unordered_map<std::string, std::unique_ptr<Channel>, NameHash, std::equal_to<>> _channels;
+  std::unordered_map<VORCallbackId, EntryPtr> _live;
   VORBaseUnknown* _owner;
-  int _dispatchDepth = 0;
-  size_t _removedCount = 0;  // entries flagged removed and not yet erased
-  void Compact();
 };

@@ -16,7 +16,7 @@ void NotifyActivity(VORDocumentData* data, VORActivityImpl* father, VORModelObje
       new VORSPPActivityNotification(Unk(father), son ? Unk(son) : nullptr, kind));
   const char* event = VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE();
   VORRootImpl* root = data->root.get();
-  root->DispatchEvent(event, n.get());
+  root->DispatchEventKeyed(Unk(father)->GetIdentity(), event, n.get());
   if (father != root)
     father->DispatchEvent(event, n.get());
 }

@@ -55,6 +55,12 @@ void VORModelObject::DispatchEvent(const char* event, VORNotification* notificat
     _publisher->Dispatch(event, notification);
 }
 
+void VORModelObject::DispatchEventKeyed(const void* key, const char* event,
+                                        VORNotification* notification) {
+  if (_publisher && _publisher->CallbackCount() > 0)
+    _publisher->DispatchKeyed(key, event, notification);
+}
+
 HRESULT VORModelObject::GetTypeName(VORUnicodeString& typeName) {
   typeName = VORUnicodeString(lateType);
   return S_OK;

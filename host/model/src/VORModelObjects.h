@@ -68,6 +68,8 @@ class VORModelObject : public virtual VORIModelEvents,
 
   // Dispatches under event name when somebody listens.
   void DispatchEvent(const char* event, VORNotification* notification);
+  // The same, reaching callbacks filed under key and callbacks without key only.
+  void DispatchEventKeyed(const void* key, const char* event, VORNotification* notification);
   bool Attached() const { return data != nullptr; }
 
   // Outgoing links of a type, in order.
