@@ -18,4 +18,10 @@ struct VORModelGeneratorOptions {
 namespace VORModelGenerator {
 // A new document (one reference, the caller's).
 VORProcess* Generate(const VORModelGeneratorOptions& options);
+// A flat level as large lines are kept: `stations` stations (a multiple of four) right under the
+// root process named lineName, in four lanes stored lane after lane; each leads to the next
+// station of its lane and, every tenth, also to the next station of the neighbouring lane. With
+// parts, every station consumes one assigned part, produces one assembly and has one station
+// resource. A new document (one reference, the caller's).
+VORProcess* GenerateFlatLevel(int stations, bool withParts, const char* lineName = "Line");
 }  // namespace VORModelGenerator

@@ -1,0 +1,87 @@
+// What one change costs on an open viewer must not depend on the size of the level: a node
+// dragged in the chart and an item assigned to one station reach the same callbacks on a level
+// of 200 stations as on one of 2,000 (bundled ZitBlt configuration, every station with one
+// input, one output and one resource).
+#include <gtest/gtest.h>
+
+#include "QELFpaProductFlowViewer.h"
+#include "QELIPertNode.h"
+#include "TempDir.h"
+#include "VORDocument.h"
+#include "VORDriver.h"
+#include "VOREventPublisher.h"
+#include "VORFrmLayout.h"
+#include "VORModelDoor.h"
+#include "VORModelGenerator.h"
+
+namespace {
+
+struct Reach {
+  unsigned long long move = 0;
+  unsigned long long change = 0;
+  int zitBltElements = 0;  // what the viewer shows besides the chart
+};
+
+QELFpaProductFlowViewer* FindViewer() {
+  for (VORFrmWindow* w : VORFrmLayout::GetCurrentLayout()->GetWindowList()) {
+    if (w->IsAKindOf(QELFpaProductFlowViewer::ClassName()))
+      return static_cast<QELFpaProductFlowViewer*>(w);
+  }
+  return nullptr;
+}
+
+// Opens the viewer on a generated level and counts the callbacks that one drag of station "S20"
+// (inside its lane, with a cross flow in and out) and one assignment to it reach.
+Reach Measure(int stations) {
+  Reach reach;
+  TempDir dir;
+  const std::string file = dir.Path() + "/level.pprx";
+  std::string error;
+  auto generated =
+      VORProcess_var::Adopt(VORModelGenerator::GenerateFlatLevel(stations, true, "Line"));
+  EXPECT_TRUE(generated->SaveAs(file, error)) << error;
+  VORDriver driver;
+  EXPECT_TRUE(driver.OpenDocument(file) && driver.PickObject("Line") &&
+              driver.StartCommand("QELFpaProductFlowViewerCmd"))
+      << driver.LastError();
+  QELFpaProductFlowViewer* viewer = FindViewer();
+  if (viewer == nullptr)
+    return reach;
+  reach.zitBltElements = driver.GetEditor()->GetISO()->GetElements().Size();
+  VORBaseUnknown_var station(driver.FindObject("S20"));
+  double x = 0.0, y = 0.0;
+  QELIPertNode_var(station)->GetPosition(x, y);
+  // The same close-up at both sizes, so that the drag crosses the same pixels.
+  viewer->GetViewer()->GetMain2DViewpoint()->SetCentre(x, y);
+  viewer->GetViewer()->GetMain2DViewpoint()->SetScale(4.0);
+
+  unsigned long long before = VOREventPublisher::CallbacksRun();
+  EXPECT_TRUE(driver.Drag(viewer->GetName().str(), x, y, x + 40.0, y - 20.0)) << driver.LastError();
+  reach.move = VOREventPublisher::CallbacksRun() - before;
+  double nx = 0.0, ny = 0.0;
+  QELIPertNode_var(station)->GetPosition(nx, ny);
+  EXPECT_NE(nx, x) << "the drag did not move the station";
+
+  VORModelDoor& door = driver.GetDocument()->GetDoor();
+  VORBaseUnknown_var part;
+  door.CreateProduct(driver.GetDocument()->GetRootProduct(), VORUnicodeString("Extra"), part);
+  before = VOREventPublisher::CallbacksRun();
+  EXPECT_EQ(door.AssignItem(station, part), S_OK);
+  reach.change = VOREventPublisher::CallbacksRun() - before;
+  driver.CloseWindow(viewer->GetName().str());
+  driver.DrainDeferred();
+  return reach;
+}
+
+TEST(NotificationFanOutTest, OneMoveAndOneChangeReachAsManyCallbacksOn200As2000Stations) {
+  const Reach small = Measure(200);
+  const Reach large = Measure(2000);
+  ASSERT_GT(small.zitBltElements, 0) << "no ZitBlts: the bundled configuration was not found";
+  EXPECT_EQ(large.zitBltElements, 10 * small.zitBltElements);
+  EXPECT_GT(small.move, 0u);
+  EXPECT_GT(small.change, 0u);
+  EXPECT_EQ(small.move, large.move);
+  EXPECT_EQ(small.change, large.change);
+}
+
+}  // namespace
