@@ -100,9 +100,13 @@ void QELFpaZitBltHideShowDlg::AllZitBltModif(VORCommand*, VORNotification*, void
     return;
   const int state = _allButton->GetState();
   SetStatusOnEveryActivity(kAll, state == VORDlgCheck);
+  // A name button set here does not notify its own change, so each name is applied as its
+  // click would: the chart then shows what the buttons say.
   for (int i = 0; _nameButtons != nullptr && i < _numberOfNames; ++i) {
-    if (_nameButtons[i] != nullptr)
-      _nameButtons[i]->SetState(state);
+    if (_nameButtons[i] == nullptr)
+      continue;
+    _nameButtons[i]->SetState(state);
+    SetStatusOnEveryActivity(_nameButtons[i]->GetTitle(), state == VORDlgCheck);
   }
   Trace(" \n  QELFpaZitBltHideShowDlg::AllZitBltModif <--");
 }

@@ -183,7 +183,9 @@ TEST_F(ZitBltVisibilityCmdTest, SeveralActivitiesShowTheFirstOnesStatesAndAllTak
       ->GetZitBltShown("Outputs", shown);
   EXPECT_FALSE(shown);
   ASSERT_TRUE(Toggle("All"));
-  EXPECT_EQ(Status("L", "Status"), 0) << "All reaches every ZitBlt of every activity";
+  EXPECT_EQ(Status("L", "All"), 0) << "All reaches every selected activity";
+  EXPECT_EQ(Status("S2", "Inputs"), 0) << "with each name of the first one";
+  EXPECT_EQ(Status("L", "Status"), 1) << "a ZitBlt the first activity does not name keeps its own";
   ASSERT_TRUE(driver.PressOK(kDialog));
 }
 

@@ -201,14 +201,10 @@ HRESULT QELEZitBltMgr::SetZitBltStatus(const VORUnicodeString& name, unsigned ch
   }
   HRESULT result = S_OK;
   if (name == VORUnicodeString("All")) {
-    // "All" stands for every ZitBlt of the activity, so that the chart shows what the dialog's
-    // buttons say.
+    // Only the overall status: the ZitBlts keep their own (the visibility dialog sets each name
+    // after "All").
     _overallStatus = status;
     RecordStatus(name, status);
-    for (auto& entry : _zitBlts) {
-      entry.second->SetStatus(status);
-      RecordStatus(entry.first, status);
-    }
   } else if (QELZitBltRep* rep = Find(name)) {
     rep->SetStatus(status);
     RecordStatus(name, status);
