@@ -215,39 +215,11 @@ void BM_ArrangeNodesWithRefresh(benchmark::State& state) {
   state.SetItemsProcessed(state.iterations() * state.range(0));
 }
 
-// Picking the level and running the viewer command: window, viewer, controller with every node
-// box and link, and the first layout of all (new) nodes.
-void BM_OpenViewer(benchmark::State& state) {
+// Opens the viewer on the level of file once per iteration; closing it and forgetting the
+// positions (so every node is new again) are not timed.
+void OpenViewerRepeatedly(benchmark::State& state, const std::string& file) {
   VORDriver driver;
-  if (!driver.OpenDocument(LineFile(static_cast<int>(state.range(0))))) {
-    state.SkipWithError(driver.LastError().c_str());
-    return;
-  }
-  VORProcess* doc = driver.GetDocument();
-  VORListValVORBaseUnknown_var* children = nullptr;
-  VORIGENode_var(doc->GetRootProcess())->GetChildren(children);
-  driver.PickObject("Line");
-  for (auto _ : state) {
-    if (!driver.StartCommand("QELFpaProductFlowViewerCmd") || FindViewer() == nullptr) {
-      state.SkipWithError(driver.LastError().c_str());
-      break;
-    }
-    state.PauseTiming();
-    FindViewer()->DeleteWindow();
-    driver.DrainDeferred();
-    for (VORBaseUnknown_var& child : *children)  // new nodes again on the next opening
-      doc->GetDoor().SetPertPosition(child, false, 0.0, 0.0);
-    state.ResumeTiming();
-  }
-  delete children;
-}
-
-// Opening the viewer on a line whose stations each list one input, one output and one
-// resource: as above, plus every station's ZitBlts built, their list commands created and run,
-// and each list drawn with its item.
-void BM_OpenViewerWithLists(benchmark::State& state) {
-  VORDriver driver;
-  if (!driver.OpenDocument(EquippedLineFile(static_cast<int>(state.range(0))))) {
+  if (!driver.OpenDocument(file)) {
     state.SkipWithError(driver.LastError().c_str());
     return;
   }
@@ -268,6 +240,19 @@ void BM_OpenViewerWithLists(benchmark::State& state) {
     state.ResumeTiming();
   }
   delete children;
+}
+
+// Picking the level and running the viewer command: window, viewer, controller with every node
+// box and link, and the first layout of all (new) nodes.
+void BM_OpenViewer(benchmark::State& state) {
+  OpenViewerRepeatedly(state, LineFile(static_cast<int>(state.range(0))));
+}
+
+// Opening the viewer on a line whose stations each list one input, one output and one
+// resource: as above, plus every station's ZitBlts built, their list commands created and run,
+// and each list drawn with its item.
+void BM_OpenViewerWithLists(benchmark::State& state) {
+  OpenViewerRepeatedly(state, EquippedLineFile(static_cast<int>(state.range(0))));
 }
 
 }  // namespace
