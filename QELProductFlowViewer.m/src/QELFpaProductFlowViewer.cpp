@@ -5,6 +5,7 @@
 
 #include "QELFpaPertServices.h"
 #include "QELIFPAAdapters.h"
+#include "QELIZitBltMgr.h"
 #include "QELIPertNodeExt.h"
 #include "QELIPertPosition.h"
 #include "QELIPertWindow.h"
@@ -19,11 +20,6 @@
 #include "VORISPPActivity.h"
 #include "VORMsgCatalog.h"
 #include "VORTrace.h"
-
-#if __has_include("QELIZitBltMgr.h")
-#include "QELIZitBltMgr.h"
-#define QEL_PFV_HAS_ZITBLT_MGR 1
-#endif
 
 namespace {
 
@@ -341,12 +337,10 @@ void QELFpaProductFlowViewer::AttachZitBlts(VORBaseUnknown_var& node) {
   delete children;
 }
 
-void QELFpaProductFlowViewer::AttachZitBlt([[maybe_unused]] VORBaseUnknown_var& node) {
-#ifdef QEL_PFV_HAS_ZITBLT_MGR
+void QELFpaProductFlowViewer::AttachZitBlt(VORBaseUnknown_var& node) {
   QELIZitBltMgr_var manager(node);
   if (VORISPPActivity_var(node) && manager)
     manager->BuildZitBltReps(_viewer.get());
-#endif
 }
 
 void QELFpaProductFlowViewer::RemoveZitBlts(VORBaseUnknown_var& node) {
@@ -361,12 +355,10 @@ void QELFpaProductFlowViewer::RemoveZitBlts(VORBaseUnknown_var& node) {
   }
 }
 
-void QELFpaProductFlowViewer::RemoveZitBlt([[maybe_unused]] VORBaseUnknown_var& node) {
-#ifdef QEL_PFV_HAS_ZITBLT_MGR
+void QELFpaProductFlowViewer::RemoveZitBlt(VORBaseUnknown_var& node) {
   QELIZitBltMgr_var manager(node);
   if (manager)
     manager->RemoveZitBlts();
-#endif
 }
 
 void QELFpaProductFlowViewer::DeletePertNodes(VORBaseUnknown_var& node) {

@@ -52,15 +52,22 @@ VORBaseUnknown_var FatherOf(const VORBaseUnknown_var& activity) {
   return father;
 }
 
-// Adds a menu item that runs the declared command header id (when it exists and is available).
-void AddHostItem(VORNotification* notification, const char* id) {
+// Adds a menu item that runs the declared command header id (when it exists and is available),
+// on argument when one is given.
+void AddHostItem(VORNotification* notification, const char* id,
+                 VORBaseUnknown* argument = nullptr) {
   auto* context = dynamic_cast<VORContext*>(notification);
   VORCommandHeader* header = VORCommandHeader::Find(id);
   if (context == nullptr || header == nullptr || !header->IsAvailable())
     return;
   if (VORDlgContextualMenu* menu = VORDlgContextualMenu::FromContext(context)) {
     auto* item = new VORDlgPushItem(menu, id);  // the menu holds its items
-    item->SetCommandHeader(header);
+    if (argument == nullptr) {
+      item->SetCommandHeader(header);
+    } else {
+      item->SetCommandHeader(VORCommandHeader_var::Adopt(new VORCommandHeader(
+          header->GetID(), header->GetModule(), header->GetClassName(), argument)));
+    }
   }
 }
 
@@ -419,7 +426,7 @@ void QELFpaProductFlowViewer::ContextMenuFor3DWindow(VORNotification* notificati
     }
     layout->SetCurrentWindow(examined != nullptr ? examined : previous);
   }
-  AddHostItem(notification, "Properties");
+  AddHostItem(notification, VORFrmHostCommands::Properties, object);
   // The grouping commands on the activities they work on; the picked one is their first pick.
   if (IsKindOf(object, "BIWActivityStation") || IsKindOf(object, "BIWActivityGrouping"))
     AddWorkbenchItem(notification, "QELFpaPertGrpActCmd");

@@ -162,6 +162,7 @@ void QELPFVNodeOrganiser::ArrangeNextActsWithRespectToCurrActs() {
 }
 
 void QELPFVNodeOrganiser::GetViewerOrSuperNodeSize(float* width, float* height) {
+  Trace().TraPrint("QELPFVNodeOrganiser::GetViewerOrSuperNodeSize -->");
   const int n = _levelList->Size();
   if (n == 0)
     return;
@@ -261,6 +262,7 @@ bool QELPFVNodeOrganiser::ArrangeNodes(VORBaseUnknown_var root, QELPertControlle
 
 void QELPFVNodeOrganiser::GetActListForPosChange(VORBaseUnknown_var& node,
                                                  VORListValVORBaseUnknown_var*& ioList) {
+  Trace().TraPrint("QELPFVNodeOrganiser::GetActListForPosChange -->");
   if (!node || ioList == nullptr)
     return;
   // The recursion "append node; append all its successors; recurse into each" with an explicit
@@ -293,6 +295,8 @@ void QELPFVNodeOrganiser::GetActListForPosChange(VORBaseUnknown_var& node,
       continue;
     }
     const VORBaseUnknown_var current = (*top.next)[top.position++];
+    // One entry line per call of the recursion this loop stands for.
+    Trace().TraPrint("QELPFVNodeOrganiser::GetActListForPosChange -->");
     if (!current)
       continue;
     ioList->Append(current);
@@ -393,6 +397,7 @@ void QELPFVNodeOrganiser::DispatchNotif(VORBaseUnknown_var node) {
 }
 
 void QELPFVNodeOrganiser::Announce(VORBaseUnknown_var& node, const QELIPertNode_var& pertNode) {
+  Trace().TraPrint("QELPFVNodeOrganiser::DispatchNotif -->");
   if (!node)
     return;
   double x = 0.0;

@@ -95,8 +95,29 @@ void BM_Generate(benchmark::State& state) {
 
 }  // namespace
 
+// A nested-entity bomb is refused before any expansion: the time stays that of a tiny parse.
+void BM_RefuseEntityBomb(benchmark::State& state) {
+  std::string bomb = "<?xml version=\"1.0\"?>\n<!DOCTYPE lolz [\n<!ENTITY lol \"lol\">\n";
+  for (int i = 1; i <= 9; ++i) {
+    bomb += "<!ENTITY lol" + std::to_string(i) + " \"";
+    for (int k = 0; k < 10; ++k)
+      bomb += i == 1 ? "&lol;" : "&lol" + std::to_string(i - 1) + ";";
+    bomb += "\">\n";
+  }
+  bomb += "]>\n<pprDocument version=\"1\">&lol9;</pprDocument>\n";
+  for (auto _ : state) {
+    std::string error;
+    VORProcess_var doc =
+        VORProcess_var::Adopt(VORProcess::LoadFromString(bomb, "bomb.pprx", error));
+    if (doc)
+      state.SkipWithError("the entity bomb was accepted");
+    benchmark::DoNotOptimize(error);
+  }
+}
+
 BENCHMARK(BM_SaveToFile)->Arg(1000)->Arg(10000)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_LoadFromFile)->Arg(1000)->Arg(10000)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_ParseOnly)->Arg(10000)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_InvariantCheck)->Arg(10000)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_Generate)->Arg(10000)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_RefuseEntityBomb)->Unit(benchmark::kMicrosecond);

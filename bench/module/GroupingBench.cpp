@@ -77,4 +77,3 @@ void BM_GroupConsecutiveStations(benchmark::State& state) {
 
 BENCHMARK(BM_GroupConsecutiveStations)->Arg(10000)->Unit(benchmark::kMillisecond)->Iterations(5);
 
-BENCHMARK_MAIN();

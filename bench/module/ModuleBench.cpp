@@ -274,5 +274,3 @@ BENCHMARK(BM_OpenViewerWithLists)
     ->Arg(2000)
     ->Unit(benchmark::kMillisecond)
     ->Iterations(5);
-
-BENCHMARK_MAIN();

@@ -3,10 +3,15 @@
 #include <memory>
 
 #include "SampleLine.h"
+#include "VORDlgFrame.h"
 #include "VORApplicationFrame.h"
 #include "VORCommandHeader.h"
 #include "VORDeferredDeletion.h"
+#include "VORFrmPropertiesDlg.h"
 #include "VORFrmWindowKinds.h"
+#include "VORIPDServices.h"
+#include "VORIResourceFactory.h"
+#include "VORISPPResourceManagement.h"
 #include "VORIVisProperties.h"
 #include "VORSelectionContext.h"
 
@@ -143,4 +148,60 @@ TEST_F(FrameTest, TheProductSpaceHidesShowsAndCentresOnTheSelectedProduct) {
   EXPECT_EQ(space->GetCenteredObject(), nullptr);
   EXPECT_EQ(space->GetReframeCount(), 1);
   VORDeferredDeletion::Drain();
+}
+
+TEST_F(FrameTest, PropertiesShowsThePickedObjectReadOnlyAndOKReleasesTheDialog) {
+  VORBaseUnknown_var s1 = Child("S1");
+  VORBaseUnknown_var s2 = Child("S2");
+  VORISPPAbstractActivity_var(s2)->SetActivityTime(42.5);
+  // A robot assigned to S2: a product made into a resource.
+  VORIProduct_var body(document->GetRootProduct());
+  VORBaseUnknown_var robot, container, description;
+  body->AddChild("Robot R1", robot);
+  ASSERT_TRUE(SUCCEEDED(VORIPDServices::GetPPRContainer(document, container)));
+  VORIResourceFactory_var factory(container);
+  ASSERT_TRUE(factory);
+  ASSERT_TRUE(SUCCEEDED(factory->CreateResource("Robot", robot, "", description)));
+  ASSERT_TRUE(SUCCEEDED(factory->AttachResource(robot, description)));
+  ASSERT_TRUE(SUCCEEDED(VORISPPResourceManagement_var(s2)->AssignResource(robot)));
+
+  // Started on the first picked object, through its declared header.
+  editor->GetCSO()->AddElement(s2);
+  VORCommandHeader* header = VORCommandHeader::Find(VORFrmHostCommands::Properties);
+  ASSERT_NE(header, nullptr);
+  header->StartCommand();
+  VORFrmPropertiesDlg* shown = VORFrmPropertiesDlg::Current();
+  ASSERT_NE(shown, nullptr);
+  EXPECT_EQ(VORDlgDialog::FindShown("PropertiesDlg"), shown);
+  EXPECT_FALSE(shown->HasCancelButton()) << "read-only: nothing to cancel";
+  using Fields = std::vector<std::pair<std::string, std::string>>;
+  EXPECT_EQ(shown->GetFields(), (Fields{{"Name", "S2"},
+                                        {"Type", "BIWActivityStation"},
+                                        {"Time", "42.5"},
+                                        {"Cycle time", "0"},
+                                        {"Inputs", ""},
+                                        {"Outputs", "Roof"},
+                                        {"Resources", "Robot R1"}}));
+  // Every field is a label showing its value.
+  bool sawValue = false;
+  for (VORCommand* c : shown->GetChildren().front()->GetChildren()) {
+    auto* label = dynamic_cast<VORDlgLabel*>(c);
+    ASSERT_NE(label, nullptr);
+    sawValue = sawValue || label->GetTitle().ConvertToUTF8() == "Robot R1";
+  }
+  EXPECT_TRUE(sawValue);
+
+  // A second Properties replaces the first; OK hides it and releases it after the event.
+  VORFrmPropertiesDlg::Show(s1);
+  VORHandle<VORFrmPropertiesDlg> second(VORFrmPropertiesDlg::Current());
+  ASSERT_TRUE(second);
+  EXPECT_EQ(second->GetFields()[4], (std::pair<std::string, std::string>{"Inputs", "Side panel"}));
+  EXPECT_EQ(VORDlgDialog::FindShown("PropertiesDlg"), second.get());
+  EXPECT_TRUE(second->UserPressOK());
+  EXPECT_EQ(VORFrmPropertiesDlg::Current(), nullptr);
+  EXPECT_EQ(VORDlgDialog::FindShown("PropertiesDlg"), nullptr);
+  const unsigned long refs = second->RefCount();
+  VORDeferredDeletion::Drain();
+  EXPECT_EQ(second->RefCount(), refs - 1);
+  EXPECT_EQ(VORFrmPropertiesDlg::Show(nullptr), nullptr);
 }

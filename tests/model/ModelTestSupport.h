@@ -1,5 +1,5 @@
 // Helpers of the model tests: a small hand-made line, a notification recorder, a structural
-// dump through the public interfaces, temporary directories.
+// dump through the public interfaces, and the shared temporary directory.
 #pragma once
 
 #include <filesystem>
@@ -10,34 +10,8 @@
 
 #include <gtest/gtest.h>
 
+#include "TempDir.h"
 #include "VORModel.h"
-
-class TempDir {
- public:
-  TempDir() {
-    std::string pattern = (std::filesystem::temp_directory_path() / "pfv-model-XXXXXX").string();
-    _path = ::mkdtemp(pattern.data());
-  }
-  ~TempDir() {
-    std::error_code ignored;
-    std::filesystem::remove_all(_path, ignored);
-  }
-  const std::string& Path() const { return _path; }
-  std::string File(const std::string& name) const { return _path + "/" + name; }
-  std::string Write(const std::string& name, const std::string& content) const {
-    std::ofstream(File(name), std::ios::binary) << content;
-    return File(name);
-  }
-  static std::string Read(const std::string& path) {
-    std::ifstream in(path, std::ios::binary);
-    std::stringstream s;
-    s << in.rdbuf();
-    return s.str();
-  }
-
- private:
-  std::string _path;
-};
 
 inline std::string Utf8(const VORUnicodeString& s) {
   return s.ConvertToUTF8();

@@ -242,6 +242,8 @@ TEST_F(ViewerTest, ClosingRestoresTheGraphEditorParametersAndTracesTheWindowsSte
   EXPECT_TRUE(has("QELProductFlowViewerTrace: QELFpaProductFlowViewer::Constructor <--"));
   EXPECT_TRUE(has("QELProductFlowViewerTrace: QELFpaProductFlowViewer::DeleteWindow <--"));
   EXPECT_TRUE(has("QELProductFlowViewerTrace: QELPFVNodeOrganiser::ArrangeNodes -->"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELPFVNodeOrganiser::GetViewerOrSuperNodeSize -->"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELPFVNodeOrganiser::DispatchNotif -->"));
   EXPECT_EQ(std::count(lines.begin(), lines.end(),
                        "QELProductFlowViewerTrace: QELFpaProductFlowViewer::Destructor -->"),
             2);
@@ -485,7 +487,16 @@ TEST_F(ViewerTest, TheChangeListKeepsDuplicatesOfNodesReachedTwice) {
   Flow(c, d);
   auto* organiser = new QELPFVNodeOrganiser();
   auto* list = new VORListValVORBaseUnknown_var;
+  int entries = 0;
+  VORTrace::SetEnabledChannels("QELProductFlowViewerTrace");
+  VORTrace::SetSink([&](const std::string&, const std::string& line) {
+    entries += line == "QELPFVNodeOrganiser::GetActListForPosChange -->";
+  });
   organiser->GetActListForPosChange(a, list);
+  VORTrace::SetSink({});
+  VORTrace::SetEnabledChannels("");
+  // One entry line per walk: A's, B's, D's (from B), C's, D's (from C).
+  EXPECT_EQ(entries, 5);
   // A, its successors B C, then B's walk (B, D, D's walk: D), then C's (C, D, D).
   std::vector<std::string> labels;
   for (const VORBaseUnknown_var& o : *list) {

@@ -4,6 +4,8 @@
 #include <filesystem>
 #include <fstream>
 
+#include <xercesc/dom/DOMElement.hpp>
+
 #include "QELZitBltConfiguration.h"
 #include "StrX.h"
 #include "VORSettingRepository.h"
@@ -119,12 +121,51 @@ TEST_F(ZitBltConfigurationTest, MissingOrBrokenFilesFailQuietlyAndAreRetriedUnti
   EXPECT_FALSE(cfg::LoadConfiguration(doc));
 }
 
-TEST_F(ZitBltConfigurationTest, EntitiesAndDoctypesAreRefused) {
+TEST_F(ZitBltConfigurationTest, ADoctypeIsAcceptedWhenItNamesNothingExternal) {
+  // Internal entities are expanded.
   Write("first/zitbltcfg.xml",
         "<?xml version=\"1.0\"?><!DOCTYPE z [<!ENTITY a \"aaaa\"><!ENTITY b \"&a;&a;&a;\">]>"
-        "<z><ActivityZitBlt ActivityType=\"&b;\"/></z>");
+        "<z><ActivityZitBlt ActivityType=\"&b;\"><ZitBlt Name=\"N\"/></ActivityZitBlt></z>");
   VORIDOMDocument_var doc;
-  EXPECT_FALSE(cfg::LoadConfiguration(doc));
+  ASSERT_TRUE(cfg::LoadConfiguration(doc));
+  EXPECT_EQ(cfg::ReadDefinitions(doc, VORUnicodeString("aaaaaaaaaaaa")).size(), 1u);
+
+  // An external DTD, an external entity (used or only declared) and an entity bomb are refused,
+  // quietly, and nothing of the named file gets in.
+  const std::string secret = Write("second/secret.txt", "TOP-SECRET");
+  std::string bomb = "<?xml version=\"1.0\"?><!DOCTYPE z [<!ENTITY l0 \"lol\">";
+  for (int i = 1; i <= 9; ++i) {
+    bomb += "<!ENTITY l" + std::to_string(i) + " \"";
+    for (int k = 0; k < 10; ++k)
+      bomb += "&l" + std::to_string(i - 1) + ";";
+    bomb += "\">";
+  }
+  bomb += "]><z>&l9;</z>";
+  const std::vector<std::string> refused = {
+      "<?xml version=\"1.0\"?><!DOCTYPE z SYSTEM \"" + secret + "\"><z/>",
+      "<?xml version=\"1.0\"?><!DOCTYPE z PUBLIC \"-//x//y\" \"http://127.0.0.1:9/z.dtd\"><z/>",
+      "<?xml version=\"1.0\"?><!DOCTYPE z [<!ENTITY s SYSTEM \"file://" + secret +
+          "\">]><z><ActivityZitBlt ActivityType=\"x\">&s;</ActivityZitBlt></z>",
+      "<?xml version=\"1.0\"?><!DOCTYPE z [<!ENTITY s SYSTEM \"" + secret + "\">]><z/>", bomb};
+  for (const std::string& text : refused) {
+    cfg::ForgetForTests();
+    Write("first/zitbltcfg.xml", text);
+    VORIDOMDocument_var none;
+    EXPECT_FALSE(cfg::LoadConfiguration(none)) << text;
+    EXPECT_FALSE(none);
+  }
+
+  // The status-bar file follows the same rules.
+  const std::string bars = Write("second/StatusBarConfiguration.xml",
+                                 "<!DOCTYPE s [<!ENTITY t \"Bars\">]><StatusBars Name=\"&t;\"/>");
+  VORIDOMDocument_var parsed;
+  ASSERT_TRUE(cfg::ParseConfigFile(VORUnicodeString(bars), parsed));
+  EXPECT_EQ(VORXercesPlatform::ToUTF8(parsed->getDocumentElement()->getAttribute(
+                VORXercesPlatform::FromUTF8("Name").c_str())),
+            "Bars");
+  Write("second/StatusBarConfiguration.xml",
+        "<!DOCTYPE s [<!ENTITY t SYSTEM \"" + secret + "\">]><StatusBars Name=\"x\"/>");
+  EXPECT_FALSE(cfg::ParseConfigFile(VORUnicodeString(bars), parsed));
 }
 
 TEST_F(ZitBltConfigurationTest, StatusBarFileComesFromTheSettingAsItStandsOrFromTheSearchPath) {

@@ -12,6 +12,7 @@
 #include "VORDocument.h"
 #include "VORDriver.h"
 #include "VORFrmLayout.h"
+#include "VORFrmPropertiesDlg.h"
 #include "VORISPPItemMgt.h"
 #include "VORModelDoor.h"
 #include "VORModuleLoader.h"
@@ -274,6 +275,26 @@ TEST_F(ZitBltViewerRefreshTest, ContextMenuOnASelectedPartOffersThePartsItems) {
   for (const char* item : {"CenterGraph", "ReframeOn", "HideShow", "QELFpaPreviewWindowManagerCmd"})
     EXPECT_NE(menu.find(item), std::string::npos) << item << "\n" << menu;
   EXPECT_EQ(VORFrmLayout::GetCurrentLayout()->GetCurrentWindow(), space);
+}
+
+TEST_F(ZitBltViewerRefreshTest, TheContextMenuAlwaysOffersThePropertiesOfThePickedObject) {
+  const std::string viewer = driver.FindWindow("")->GetName().str();
+  // The picked activity (the viewer's level) has no item of its own, but Properties is there.
+  ASSERT_TRUE(driver.OpenContextMenu(viewer, -500, -500)) << driver.LastError();
+  EXPECT_NE(driver.DescribeMenu().find("Properties"), std::string::npos) << driver.DescribeMenu();
+  ASSERT_TRUE(driver.ChooseMenuItem("Properties")) << driver.LastError();
+  ASSERT_NE(VORFrmPropertiesDlg::Current(), nullptr);
+  EXPECT_EQ(VORFrmPropertiesDlg::Current()->GetFields().front().second, "Line");
+  // A picked part: its properties, read-only.
+  ASSERT_TRUE(driver.PickObject("Floor")) << driver.LastError();
+  ASSERT_TRUE(driver.OpenContextMenu(viewer, -500, -500)) << driver.LastError();
+  ASSERT_TRUE(driver.ChooseMenuItem("Properties")) << driver.LastError();
+  VORFrmPropertiesDlg* shown = VORFrmPropertiesDlg::Current();
+  ASSERT_NE(shown, nullptr);
+  EXPECT_EQ(shown->GetObject(), Object("P1"));
+  EXPECT_EQ(shown->GetFields().front().second, "Floor");
+  EXPECT_TRUE(shown->UserPressOK());
+  driver.DrainDeferred();
 }
 
 }  // namespace

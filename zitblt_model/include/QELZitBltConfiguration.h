@@ -35,6 +35,10 @@ bool LoadConfiguration(VORIDOMDocument_var& document);
 const std::vector<QELZitBltDefinition>& DefinitionsFor(const VORIDOMDocument_var& document,
                                                        const VORUnicodeString& activityType);
 
+// The definitions for the type name of activity (its VORISpecObject; none gives the empty type).
+const std::vector<QELZitBltDefinition>& DefinitionsForActivity(const VORIDOMDocument_var& document,
+                                                               VORBaseUnknown* activity);
+
 // The same, read from the DOM every time: the plain version the cached one is checked against.
 std::vector<QELZitBltDefinition> ReadDefinitions(const VORIDOMDocument_var& document,
                                                  const VORUnicodeString& activityType);

@@ -127,11 +127,8 @@ void QELEZitBltCBSubscriber::CreateUpdateCommands() {
   VORIDOMDocument_var document;
   if (!manager || !manager->LoadConfiguration(document) || !document)
     return;
-  VORISpecObject_var spec{VORBaseUnknown_var(activity)};
-  VORUnicodeString typeName;
-  if (spec)
-    spec->GetTypeName(typeName);
-  for (const QELZitBltDefinition& d : QELZitBltConfiguration::DefinitionsFor(document, typeName)) {
+  for (const QELZitBltDefinition& d :
+       QELZitBltConfiguration::DefinitionsForActivity(document, activity)) {
     if (!d.hasUpdateData)
       continue;
     auto header = VORCommandHeader_var::Adopt(

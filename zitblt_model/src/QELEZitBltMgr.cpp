@@ -72,11 +72,8 @@ void QELEZitBltMgr::BuildZitBlts() {
     subscriber->Subscribe();
   if (!document)
     return;
-  VORISpecObject_var spec{VORBaseUnknown_var(activity)};
-  VORUnicodeString typeName;
-  if (spec)
-    spec->GetTypeName(typeName);
-  for (const QELZitBltDefinition& d : QELZitBltConfiguration::DefinitionsFor(document, typeName)) {
+  for (const QELZitBltDefinition& d :
+       QELZitBltConfiguration::DefinitionsForActivity(document, activity)) {
     auto header = VORCommandHeader_var::Adopt(
         new VORCommandHeader(Narrow(d.name), Narrow(d.loadModule), Narrow(d.type), activity,
                              VORCommandHeader::Available));

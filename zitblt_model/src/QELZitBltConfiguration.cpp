@@ -7,6 +7,7 @@
 #include <xercesc/dom/DOMNodeList.hpp>
 
 #include "VOREnv.h"
+#include "VORISpecObject.h"
 #include "VORSettingRepository.h"
 
 namespace {
@@ -32,6 +33,15 @@ const std::u16string& Xml(const char* text) {
   return it->second;
 }
 
+// A configuration file found along VORStartupPath; empty when the variable is unset or no folder
+// has the file.
+VORUnicodeString FindOnStartupPath(const char* file) {
+  const char* startup = VORGetEnv("VORStartupPath");
+  if (startup == nullptr)
+    return {};
+  return VORFindPath(file, VORUnicodeString(startup));
+}
+
 VORUnicodeString Attribute(const xercesc::DOMElement* element, const char* name) {
   return VORUnicodeString::FromUTF16(element->getAttribute(Xml(name).c_str()));
 }
@@ -45,12 +55,8 @@ bool LoadConfiguration(VORIDOMDocument_var& document) {
     document = ZitBltDocument();
     return true;
   }
-  const char* startup = VORGetEnv("VORStartupPath");
-  if (startup == nullptr)
-    return false;
-  VORUnicodeString path = VORFindPath("zitbltcfg.xml", VORUnicodeString(startup));
   VORIDOMDocument_var parsed;
-  if (!ParseConfigFile(path, parsed))
+  if (!ParseConfigFile(FindOnStartupPath("zitbltcfg.xml"), parsed))
     return false;
   ZitBltDocument() = parsed;
   zitBltLoaded = true;
@@ -106,6 +112,15 @@ const std::vector<QELZitBltDefinition>& DefinitionsFor(const VORIDOMDocument_var
   return it->second;
 }
 
+const std::vector<QELZitBltDefinition>& DefinitionsForActivity(const VORIDOMDocument_var& document,
+                                                               VORBaseUnknown* activity) {
+  VORISpecObject_var spec{VORBaseUnknown_var(activity)};
+  VORUnicodeString typeName;
+  if (spec)
+    spec->GetTypeName(typeName);
+  return DefinitionsFor(document, typeName);
+}
+
 VORUnicodeString StatusBarConfigFile() {
   VORUnicodeString configured;
   if (VORSettingRepository* settings = VORSettingRepository::GetRepository("QELPFViewerSettings")) {
@@ -114,10 +129,7 @@ VORUnicodeString StatusBarConfigFile() {
   // A configured name is used as it stands: it is not searched along VORStartupPath.
   if (!configured.IsEmpty())
     return configured;
-  const char* startup = VORGetEnv("VORStartupPath");
-  if (startup == nullptr)
-    return {};
-  return VORFindPath("StatusBarConfiguration.xml", VORUnicodeString(startup));
+  return FindOnStartupPath("StatusBarConfiguration.xml");
 }
 
 bool ParseConfigFile(const VORUnicodeString& path, VORIDOMDocument_var& document) {

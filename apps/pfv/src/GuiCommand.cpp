@@ -1,7 +1,6 @@
 // "pfv [document]" and "pfv gui": the application window (on the bundled sample line when no
-// document is given); "--has-gui" only answers whether a window can be opened. Also registers
-// the PNG chart writer for "pfv export". Built only with the Qt shell.
-#if __has_include("VORQtMainWindow.h")
+// document is given); "--has-gui" only answers whether a window can be opened. Also holds the
+// PNG and PDF chart writers of "pfv export" (PfvRegisterQtWriters). Built only with the Qt shell.
 
 #include <QImage>
 #include <QTimer>
@@ -146,7 +145,6 @@ bool WritePNG(VORViewer& viewer, const std::string& path, std::string& error) {
 PFV_COMMAND(gui, "gui", "[document.pprx] [--script FILE] [--screenshot FILE.png] | --has-gui",
             "open the window (also without a sub-command); --has-gui tells whether one can open",
             RunGui);
-static const bool pfvPngWriter = PfvRegisterImageWriter("png", WritePNG);
 
 namespace {
 class PdfBook : public PfvBookWriter {
@@ -163,16 +161,17 @@ class PdfBook : public PfvBookWriter {
  private:
   VORQtPdfBook _book;
 };
+bool WritePDF(VORViewer& viewer, const std::string& path, std::string& error) {
+  return VORQtPdfBook::WriteChart(viewer, std::filesystem::path(path).stem().string(), path,
+                                  error);
+}
+
 }  // namespace
 
-static const bool pfvPdfWriter = PfvRegisterImageWriter(
-    "pdf", [](VORViewer& viewer, const std::string& path, std::string& error) {
-      return VORQtPdfBook::WriteChart(viewer, std::filesystem::path(path).stem().string(), path,
-                                      error);
-    });
-static const bool pfvPdfBook =
-    PfvRegisterBookWriter("pdf", [](const std::string& title) -> std::unique_ptr<PfvBookWriter> {
-      return std::make_unique<PdfBook>(title);
-    });
-
-#endif
+void PfvRegisterQtWriters() {
+  PfvRegisterImageWriter("png", WritePNG);
+  PfvRegisterImageWriter("pdf", WritePDF);
+  PfvRegisterBookWriter("pdf", [](const std::string& title) -> std::unique_ptr<PfvBookWriter> {
+    return std::make_unique<PdfBook>(title);
+  });
+}

@@ -7,7 +7,9 @@
 #include <cstdlib>
 #include <filesystem>
 
+#include "VORFrameInit.h"
 #include "VORModuleLoader.h"
+#include "VORPertInit.h"
 
 std::vector<PfvCommand>& PfvCommands() {
   static std::vector<PfvCommand> commands;
@@ -20,6 +22,16 @@ bool PfvRegisterCommand(PfvCommand command) {
                              [](const PfvCommand& c, const std::string& n) { return c.name < n; });
   commands.insert(at, std::move(command));
   return true;
+}
+
+void PfvRegisterCommands() {
+  for (PfvCommand (*describe)() :
+       {PfvCommand_check, PfvCommand_export, PfvCommand_gen, PfvCommand_script})
+    PfvRegisterCommand(describe());
+#ifdef PFV_WITH_QT
+  PfvRegisterCommand(PfvCommand_gui());
+  PfvRegisterQtWriters();
+#endif
 }
 
 void PfvInitialiseProcess(const char* argv0) {
@@ -49,4 +61,6 @@ void PfvInitialiseProcess(const char* argv0) {
       }
     }
   }
+  VORInitFrame();
+  VORInitPert();
 }

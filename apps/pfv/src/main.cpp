@@ -19,6 +19,7 @@ void PrintUsage() {
 
 int main(int argc, char** argv) {
   PfvInitialiseProcess(argv[0]);
+  PfvRegisterCommands();
   const std::string first = argc > 1 ? argv[1] : "";
   if (first == "--help" || first == "-h" || first == "help") {
     PrintUsage();

@@ -1,6 +1,6 @@
 // The adapters of a process model's root process ("BIWActivityRoot"): the PERT adapter through
 // which the process keeps its chart data, and the controller of the chart that currently shows
-// one of its levels. Answered by every root process once vor_frame is loaded.
+// one of its levels. Answered by every root process once VORInitFrame has run.
 #pragma once
 
 #include "VORHandle.h"
@@ -51,3 +51,6 @@ class QELIFPAAdapters : public virtual VORBaseUnknown {
   virtual QELPertController* GetPertController() = 0;
 };
 VOR_DECLARE_HANDLE(QELIFPAAdapters);
+
+// Registers QELIFPAAdapters on "BIWActivityRoot" (VORInitFrame).
+void QELRegisterFPAAdapters();

@@ -95,8 +95,9 @@ inline constexpr const char* HideShow = "HideShow";
 inline constexpr const char* PertChart = "PertChart";
 inline constexpr const char* ProductSpace = "ProductSpace";
 inline constexpr const char* PreviewWindow = "QELFpaPreviewWindowManagerCmd";
-// Declares the headers above (done when the frame library loads; again after a test cleared
-// them).
+// The read-only properties of the argument, else of the first picked object (VORFrmPropertiesDlg).
+inline constexpr const char* Properties = "Properties";
+// Declares the headers above (VORInitFrame does it; again after a test cleared them).
 void DeclareAll();
 }  // namespace VORFrmHostCommands
 

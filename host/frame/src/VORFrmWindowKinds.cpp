@@ -8,6 +8,7 @@
 
 #include "VORApplicationFrame.h"
 #include "VORCommandHeader.h"
+#include "VORFrmPropertiesDlg.h"
 #include "VORIGENode.h"
 #include "VORIGraphNodeLayout.h"
 #include "VORIProduct.h"
@@ -204,13 +205,10 @@ void Host(const char* id, std::function<void(VORBaseUnknown*)> work) {
   auto header = VORCommandHeader_var::Adopt(new VORCommandHeader(id, "", id));
   VORCommandHeader::Declare(header);
 }
-
-const bool declaredAtLoad = (VORFrmHostCommands::DeclareAll(), true);
 }  // namespace
 
 namespace VORFrmHostCommands {
 void DeclareAll() {
-  (void)declaredAtLoad;
   Host(TileWinH, [](VORBaseUnknown*) { VORFrmLayout::GetCurrentLayout()->TileHorizontally(); });
   Host(CenterGraph, [](VORBaseUnknown* argument) {
     if (VORNewInventorySpaceWnd* space = CurrentProductSpace())
@@ -240,6 +238,8 @@ void DeclareAll() {
     auto* window = new VORNewInventorySpaceWnd("Product Space", editor);
     window->SetTitle(FileNameOf(editor) + " - Product Space");
   });
+  Host(Properties,
+       [](VORBaseUnknown* argument) { VORFrmPropertiesDlg::Show(Target(argument).get()); });
   Host(PreviewWindow, [](VORBaseUnknown* argument) {
     VORBaseUnknown_var product = Target(argument);
     VORFrmEditor* editor = VORFrmEditor::GetCurrentEditor();

@@ -22,8 +22,9 @@ class VORIDOMDocument : public VORBaseUnknown {
 };
 VOR_DECLARE_HANDLE(VORIDOMDocument);
 
-// Parses the file at path with the hardened parser (no DTD, no entities, no validation). S_OK
-// and the document, or E_FAIL with the reason in error (file, line and column when it parsed).
+// Parses the configuration file at path with the hardened parser: a DOCTYPE is accepted as long
+// as it names nothing external, entity expansion is bounded, no validation. S_OK and the
+// document, or E_FAIL with the reason in error (file, line and column when it parsed).
 inline HRESULT VORParseXMLFile(const std::string& path, VORIDOMDocument_var& document,
                                std::string* error = nullptr) {
   std::string why;
@@ -32,7 +33,9 @@ inline HRESULT VORParseXMLFile(const std::string& path, VORIDOMDocument_var& doc
       *error = why;
     return E_FAIL;
   }
-  VORXercesPlatform::Document parsed = VORXercesPlatform::ParseFile(path, why);
+  VORXercesPlatform::ParseLimits limits;
+  limits.acceptInternalDoctype = true;
+  VORXercesPlatform::Document parsed = VORXercesPlatform::ParseFile(path, why, limits);
   if (!parsed) {
     if (error)
       *error = why;

@@ -68,7 +68,7 @@ inline constexpr const char* Product = "ASMPRODUCT";
 inline constexpr const char* MfgAssembly = "QELMfgAssy";
 inline constexpr const char* Container = "SPPContainer";
 
-// Declares the model's late types (idempotent; also done by a static initialiser of vor_model).
+// Declares the model's late types (idempotent; VORInitModel does it).
 void Declare();
 // True for the activity types the model can create (everything under "SPPActivity").
 bool IsActivityType(const std::string& type);

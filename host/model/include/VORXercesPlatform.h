@@ -1,6 +1,7 @@
 // Process-level set-up of the XML parser and the hardened DOM parse that every XML reader of
-// the application uses: no DOCTYPE (so no entities, no external DTD), no network, no
-// validation, bounded depth and memory, files read by us, errors with file, line and column.
+// the application uses: no DOCTYPE (so no entities, no external DTD; configuration files may
+// have one that names nothing external), no network, no validation, bounded depth, memory and
+// entity expansion, files read by us, errors with file, line and column.
 #pragma once
 
 #include <cstddef>
@@ -32,6 +33,9 @@ struct ParseLimits {
   int maxDepth = 512;
   // Attributes of one element; checked on the raw text, before the parser builds any of them.
   int maxAttributes = 1024;
+  // Accepts a DOCTYPE whose internal subset names nothing external (no external DTD, no
+  // external entity); entity expansion stays bounded. Configuration files only.
+  bool acceptInternalDoctype = false;
   // Called now and then during the parse with the share of the content read so far (0..1).
   std::function<void(double)> progress;
 };
@@ -62,7 +66,8 @@ Document ParseMemory(const std::string& content, const std::string& name, std::s
 // Reads path itself (regular file, size cap) then parses.
 Document ParseFile(const std::string& path, std::string& error, const ParseLimits& limits = {});
 
-// Checks the raw text before any parser sees it: no NUL byte, no DOCTYPE, no element with more
+// Checks the raw text before any parser sees it: no NUL byte, no DOCTYPE (unless
+// limits.acceptInternalDoctype: the parse then refuses anything external), no element with more
 // than limits.maxAttributes attributes, no nesting deeper than limits.maxDepth. False with
 // error = "<name>:<line>:<column>: <what is wrong>".
 bool CheckRawText(const std::string& content, const std::string& name, std::string& error,

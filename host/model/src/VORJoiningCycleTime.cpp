@@ -1,4 +1,6 @@
 // The cycle-time interfaces of the joining activities, as code extensions of their late types.
+#include "VORJoiningCycleTime.h"
+
 #include "QELIBIWCurveFasteningActivity.h"
 #include "QELIBIWWeldingActivity.h"
 #include "VORExtensionRegistry.h"
@@ -57,7 +59,9 @@ class VORCurveFasteningCycleTime : public VORExtension, public QELIBIWCurveFaste
   ~VORCurveFasteningCycleTime() override = default;
 };
 
-const bool kRegistered = [] {
+}  // namespace
+
+void VORRegisterJoiningCycleTimes() {
   using namespace VORModelLateTypes;
   for (const char* type : {SpotWelding, StudWelding, SpotGluing, Clinching})
     VORExtensionRegistry::Register(
@@ -67,7 +71,4 @@ const bool kRegistered = [] {
     VORExtensionRegistry::Register(
         type, QELIBIWCurveFasteningActivity::IID(),
         []() -> VORExtension* { return new VORCurveFasteningCycleTime(); }, VORExtensionKind::Code);
-  return true;
-}();
-
-}  // namespace
+}

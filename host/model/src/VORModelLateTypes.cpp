@@ -1,4 +1,4 @@
-// The model's late types, declared when vor_model is loaded.
+// The model's late types, declared by VORInitModel.
 #include <array>
 #include <string_view>
 
@@ -48,12 +48,5 @@ bool IsWeldingType(const std::string& type) {
   }
   return false;
 }
-
-namespace {
-const bool kDeclared = [] {
-  Declare();
-  return true;
-}();
-}  // namespace
 
 }  // namespace VORModelLateTypes

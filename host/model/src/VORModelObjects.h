@@ -223,6 +223,15 @@ class VORActivityImpl : public VORGraphNodeImpl,
   ~VORActivityImpl() override;
 };
 
+// True when node is ancestor or lies below it (the one walk up the process tree).
+inline bool VORIsInsideNode(const VORGraphNodeImpl* node, const VORGraphNodeImpl* ancestor) {
+  for (const VORGraphNodeImpl* n = node; n != nullptr; n = n->father) {
+    if (n == ancestor)
+      return true;
+  }
+  return false;
+}
+
 // The item bookkeeping shared by stations and groupings.
 class VORBIWItemInfoImpl : public virtual QELIBIWItemInfo {
  public:

@@ -63,13 +63,37 @@ class FirstErrorHandler : public DOMErrorHandler {
 };
 
 // Never resolves anything: no external entity, DTD or schema is ever read.
+// Resolves nothing: remembers that something external was asked for, so that the parse is
+// refused even where the parser would carry on without it.
 class NullResolver : public DOMLSResourceResolver {
  public:
   DOMLSInput* resolveResource(const XMLCh*, const XMLCh*, const XMLCh*, const XMLCh*,
                               const XMLCh*) override {
+    asked = true;
     return nullptr;
   }
+  bool asked = false;
 };
+
+bool IsSet(const XMLCh* text) {
+  return text != nullptr && *text != 0;
+}
+
+// True when the document type names an external DTD or declares an external entity.
+bool NamesSomethingExternal(const DOMDocument* document) {
+  const DOMDocumentType* type = document->getDoctype();
+  if (type == nullptr)
+    return false;
+  if (IsSet(type->getSystemId()) || IsSet(type->getPublicId()))
+    return true;
+  const DOMNamedNodeMap* entities = type->getEntities();
+  for (XMLSize_t i = 0; entities != nullptr && i < entities->getLength(); ++i) {
+    const auto* entity = static_cast<const DOMEntity*>(entities->item(i));
+    if (IsSet(entity->getSystemId()) || IsSet(entity->getPublicId()))
+      return true;
+  }
+  return false;
+}
 
 // Bounds the nesting depth and remembers where each element starts (byte offset).
 class DepthFilter : public DOMLSParserFilter {
@@ -224,9 +248,10 @@ Document ParseMemory(const std::string& content, const std::string& name, std::s
     impl->parser = parser;
     impl->filter->parser = dynamic_cast<DOMLSParserImpl*>(parser);
     DOMConfiguration* c = parser->getDomConfig();
-    c->setParameter(XMLUni::fgDOMDisallowDoctype, true);
+    c->setParameter(XMLUni::fgDOMDisallowDoctype, !limits.acceptInternalDoctype);
     c->setParameter(XMLUni::fgXercesCalculateSrcOfs, true);
-    c->setParameter(XMLUni::fgXercesLoadExternalDTD, false);
+    // With a DOCTYPE accepted, an external DTD goes to the resolver, which refuses it.
+    c->setParameter(XMLUni::fgXercesLoadExternalDTD, limits.acceptInternalDoctype);
     c->setParameter(XMLUni::fgXercesDisableDefaultEntityResolution, true);
     c->setParameter(XMLUni::fgDOMResourceResolver, impl->resolver.get());
     c->setParameter(XMLUni::fgXercesSecurityManager, impl->security.get());
@@ -258,6 +283,12 @@ Document ParseMemory(const std::string& content, const std::string& name, std::s
   }
   if (impl->filter->tooDeep) {
     error = name + ": elements nested deeper than " + std::to_string(limits.maxDepth);
+    return result;
+  }
+  const bool external = impl->resolver->asked ||
+                        (impl->document != nullptr && NamesSomethingExternal(impl->document));
+  if (external) {
+    error = name + ": refers to an external DTD or entity, which is refused";
     return result;
   }
   if (!error.empty())

@@ -1,7 +1,8 @@
 // A single pass over the raw bytes that refuses what the parser would choke on or silently
-// accept: NUL bytes, a DOCTYPE, elements with a huge number of attributes (the parser's
-// attribute handling is quadratic), and nesting beyond the depth limit. It follows only the
-// lexical structure of well-formed XML; anything else is left to the parser to report.
+// accept: NUL bytes, a DOCTYPE (unless the caller accepts one: configuration files, whose
+// parse then refuses anything external), elements with a huge number of attributes (the
+// parser's attribute handling is quadratic), and nesting beyond the depth limit. It follows
+// only the lexical structure of well-formed XML; anything else is left to the parser to report.
 #include <cstring>
 #include <string_view>
 
@@ -33,7 +34,9 @@ class RawChecker {
       } else if (Starts(rest, "<?")) {
         i = Skip(open + 2, "?>");
       } else if (Starts(rest, "<!DOCTYPE")) {
-        return Fail(open, "a DOCTYPE is not allowed in this file", error);
+        if (!_limits.acceptInternalDoctype)
+          return Fail(open, "a DOCTYPE is not allowed in this file", error);
+        i = SkipDoctype(open + 9);
       } else if (Starts(rest, "</")) {
         --depth;
         i = Skip(open + 2, ">");
@@ -61,6 +64,30 @@ class RawChecker {
   size_t Skip(size_t from, std::string_view end) const {
     const size_t at = _text.find(end, from);
     return at == std::string_view::npos ? _text.size() : at + end.size();
+  }
+  // Past the DOCTYPE declaration whose name starts at from: its quoted literals, comments and
+  // internal subset may hold '>' and '<'.
+  size_t SkipDoctype(size_t from) const {
+    char quote = 0;
+    bool subset = false;
+    for (size_t i = from; i < _text.size(); ++i) {
+      const char c = _text[i];
+      if (quote != 0) {
+        if (c == quote)
+          quote = 0;
+      } else if (c == '"' || c == '\'') {
+        quote = c;
+      } else if (subset && Starts(_text.substr(i), "<!--")) {
+        i = Skip(i + 4, "-->") - 1;
+      } else if (c == '[') {
+        subset = true;
+      } else if (c == ']') {
+        subset = false;
+      } else if (c == '>' && !subset) {
+        return i + 1;
+      }
+    }
+    return _text.size();
   }
   // Past the start tag beginning at from (after '<'): counts the '=' outside quoted values and
   // tells whether the tag closes itself.

@@ -7,7 +7,7 @@
 #include "QELPertActivityColors.h"
 #include "QELIPertPosition.h"
 #include "QELPertClientVisuServices.h"
-#include "QELPertNodeData.h"
+#include "QELPertNodeExtensions.h"
 #include "QELPertNotifications.h"
 #include "QELPertViewer.h"
 #include "VOR2DPolygonRep.h"

@@ -2,7 +2,7 @@
 // on top of the document's chart data (VORIGraphNodeLayout).
 #include "QELIPertNode.h"
 #include "QELIPertPosition.h"
-#include "QELPertNodeData.h"
+#include "QELPertNodeExtensions.h"
 #include "VORExtensionRegistry.h"
 #include "VORIGENode.h"
 #include "VORIGraphNodeLayout.h"
@@ -147,8 +147,9 @@ class QELEPertPosition : public VORExtension, public QELIPertPosition {
   }
 };
 
-const bool registered = [] {
-  VORModelLateTypes::Declare();
+}  // namespace
+
+void QELPertRegisterNodeExtensions() {
   VORExtensionRegistry::Register(
       VORModelLateTypes::GraphNode, QELIPertNodeExt::IID(),
       []() -> VORExtension* { return new QELEPertNodeExt(); }, VORExtensionKind::Data);
@@ -158,7 +159,4 @@ const bool registered = [] {
   VORExtensionRegistry::Register(
       VORModelLateTypes::GraphNode, QELIPertPosition::IID(),
       []() -> VORExtension* { return new QELEPertPosition(); }, VORExtensionKind::Code);
-  return true;
-}();
-
-}  // namespace
+}

@@ -8,6 +8,7 @@
 #include <cstdio>
 
 #include "VORDeferredDeletion.h"
+#include "VORQtInit.h"
 
 namespace {
 bool IsUserEvent(QEvent::Type type) {
@@ -32,6 +33,7 @@ bool IsUserEvent(QEvent::Type type) {
 }  // namespace
 
 VORQtApplication::VORQtApplication(int& argc, char** argv) : QApplication(argc, argv) {
+  VORInitQt();
   setApplicationName(QStringLiteral("pfv"));
   setApplicationDisplayName(QStringLiteral("Product Flow Viewer"));
   setOrganizationName(QStringLiteral("pfv"));

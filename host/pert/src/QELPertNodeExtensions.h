@@ -1,4 +1,5 @@
-// The data extension behind QELIPertNodeExt, seen by the rest of the graph editor.
+// The graph editor's node extensions: the data extension behind QELIPertNodeExt, seen by the
+// rest of the graph editor, and their registration.
 #pragma once
 
 #include "QELIPertNodeExt.h"
@@ -58,3 +59,6 @@ class QELEPertNodeExt : public VORExtension, public QELIPertNodeExt {
   double _drawnW = 0.0;
   double _drawnH = 0.0;
 };
+
+// Registers QELIPertNodeExt, QELIPertNode and QELIPertPosition on graph nodes (VORInitPert).
+void QELPertRegisterNodeExtensions();

@@ -90,6 +90,10 @@ class QELEFPAAdapters : public VORExtension, public QELIFPAAdapters {
   QELPertController* _controller = nullptr;
 };
 
-VOR_REGISTER_EXTENSION(QELEFPAAdapters, "BIWActivityRoot", QELIFPAAdapters, VORExtensionKind::Data);
-
 }  // namespace
+
+void QELRegisterFPAAdapters() {
+  VORExtensionRegistry::Register(
+      "BIWActivityRoot", QELIFPAAdapters::IID(),
+      []() -> VORExtension* { return new QELEFPAAdapters(); }, VORExtensionKind::Data);
+}

@@ -1,11 +1,9 @@
+#include "QELPertClientVisuServices.h"
+
 #include <cmath>
-#include <unordered_map>
 
 #include "QELFpaPertServices.h"
-#include "QELPertClientVisuServices.h"
-#include "QELPertNodeData.h"
-#include "QELPertNodeTraverser.h"
-#include "QELPertController.h"
+#include "QELPertNodeExtensions.h"
 #include "VORIGraphNodeLayout.h"
 
 namespace {
@@ -114,88 +112,5 @@ HRESULT QELPertClientVisuServices::CalculateSnapPositionInPert(double& x, double
     return E_FAIL;
   x = Snap(x, cell);
   y = Snap(y, cell);
-  return S_OK;
-}
-
-QELIPertNodeExt_var QELFpaPertBaseServices::GetPertExtension(VORIGENode_var& node, bool& created) {
-  created = false;
-  if (!node)
-    return QELIPertNodeExt_var();
-  // Extensions are made on first query: remember which nodes were asked before.
-  static std::unordered_map<VORBaseUnknown*, const void*> known;
-  QELIPertNodeExt_var ext(node);
-  if (!ext)
-    return ext;
-  VORBaseUnknown* key = node.Identity();
-  auto it = known.find(key);
-  if (it == known.end() || it->second != ext.get()) {
-    // A new object at a recycled address has a new extension as well.
-    known[key] = ext.get();
-    created = true;
-  }
-  return ext;
-}
-
-HRESULT QELFpaPertBaseServices::InitNodePosition(VORIGENode_var& node) {
-  QELEPertNodeExt* ext = node ? QELEPertNodeExt::Of(node) : nullptr;
-  if (ext == nullptr)
-    return E_FAIL;
-  VORIGraphNodeLayout_var layout(node);
-  if (layout && layout->HasPertPosition())
-    return S_FALSE;
-  // Index among the siblings, from a cached table of the last parent asked about.
-  static VORBaseUnknown* lastParent = nullptr;
-  static std::unordered_map<VORBaseUnknown*, int> indexes;
-  VORBaseUnknown_var parent;
-  int index = 0;
-  if (node->GetParentNode(parent) == S_OK && parent) {
-    auto it = indexes.find(node.Identity());
-    if (lastParent != parent.Identity() || it == indexes.end()) {
-      indexes.clear();
-      lastParent = parent.Identity();
-      VORIGENode_var parentNode(parent);
-      VORListValVORBaseUnknown_var* siblings = nullptr;
-      if (parentNode && SUCCEEDED(parentNode->GetChildren(siblings)) && siblings != nullptr) {
-        int i = 0;
-        for (const VORBaseUnknown_var& s : *siblings)
-          indexes[s.Identity()] = i++;
-      }
-      delete siblings;
-      it = indexes.find(node.Identity());
-    }
-    if (it != indexes.end())
-      index = it->second;
-  }
-  double x = 2.0 * QELPertParameters::PERT_GRID_CELL_SIZE * index;
-  double y = 0.0;
-  QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 0, QELIPertNode_var());
-  ext->SetProvisionalPosition(x, y);
-  return S_OK;
-}
-
-QELPertNodeTraverser::QELPertNodeTraverser(QELPertController* controller)
-    : VORCommand(nullptr, "QELPertNodeTraverser"), _controller(controller) {}
-
-HRESULT QELPertNodeTraverser::HideChildrenNodes(VORIGENode_var& node) {
-  if (_controller == nullptr || !node)
-    return E_FAIL;
-  return _controller->HideInnerNodes(node);
-}
-
-HRESULT QELPertNodeTraverser::ShowChildrenNodes(VORIGENode_var& node) {
-  if (_controller == nullptr || !node)
-    return E_FAIL;
-  return _controller->ShowInnerNodes(node);
-}
-
-HRESULT QELPertNodeTraverser::ChangePertNodeShape(PertNodeState state) {
-  QELIPertNodeExt_var ext(_model);
-  if (!ext)
-    return E_FAIL;
-  const HRESULT hr = ext->SetState(state);
-  if (FAILED(hr))
-    return hr;
-  if (_controller != nullptr && _controller->IsInChart(_model))
-    _controller->UpdateNodeShape(_model);
   return S_OK;
 }

@@ -1,0 +1,10 @@
+// The one initialisation of the kernel layer. Nothing of its own to register yet: the first link of
+// the chain.
+//
+// Layers register their extensions and late types here, never from static initialisers. The
+// program and every test program call the initialisation of the highest layer they use first
+// thing; each one initialises the layers it uses before its own registrations, so the order is
+// always kernel, model, interaction, visu, dialog, frame, pert, qt. Idempotent.
+#pragma once
+
+void VORInitKernel();

@@ -1,0 +1,3 @@
+#include "VORKernelInit.h"
+
+void VORInitKernel() {}

@@ -1,0 +1,10 @@
+// The one initialisation of the model layer. Declares the model's late types and registers the
+// joining activities' cycle-time extensions.
+//
+// Layers register their extensions and late types here, never from static initialisers. The
+// program and every test program call the initialisation of the highest layer they use first
+// thing; each one initialises the layers it uses before its own registrations, so the order is
+// always kernel, model, interaction, visu, dialog, frame, pert, qt. Idempotent.
+#pragma once
+
+void VORInitModel();

@@ -1,0 +1,61 @@
+#include "QELFpaPertServices.h"
+
+#include "QELPertClientVisuServices.h"
+#include "QELPertNodeExtensions.h"
+#include "VORIGraphNodeLayout.h"
+
+QELIPertNodeExt_var QELFpaPertBaseServices::GetPertExtension(VORIGENode_var& node, bool& created) {
+  created = false;
+  if (!node)
+    return QELIPertNodeExt_var();
+  // Extensions are made on first query: remember which nodes were asked before.
+  static std::unordered_map<VORBaseUnknown*, const void*> known;
+  QELIPertNodeExt_var ext(node);
+  if (!ext)
+    return ext;
+  VORBaseUnknown* key = node.Identity();
+  auto it = known.find(key);
+  if (it == known.end() || it->second != ext.get()) {
+    // A new object at a recycled address has a new extension as well.
+    known[key] = ext.get();
+    created = true;
+  }
+  return ext;
+}
+
+HRESULT QELFpaPertBaseServices::InitNodePosition(VORIGENode_var& node) {
+  QELEPertNodeExt* ext = node ? QELEPertNodeExt::Of(node) : nullptr;
+  if (ext == nullptr)
+    return E_FAIL;
+  VORIGraphNodeLayout_var layout(node);
+  if (layout && layout->HasPertPosition())
+    return S_FALSE;
+  // Index among the siblings, from a cached table of the last parent asked about.
+  static VORBaseUnknown* lastParent = nullptr;
+  static std::unordered_map<VORBaseUnknown*, int> indexes;
+  VORBaseUnknown_var parent;
+  int index = 0;
+  if (node->GetParentNode(parent) == S_OK && parent) {
+    auto it = indexes.find(node.Identity());
+    if (lastParent != parent.Identity() || it == indexes.end()) {
+      indexes.clear();
+      lastParent = parent.Identity();
+      VORIGENode_var parentNode(parent);
+      VORListValVORBaseUnknown_var* siblings = nullptr;
+      if (parentNode && SUCCEEDED(parentNode->GetChildren(siblings)) && siblings != nullptr) {
+        int i = 0;
+        for (const VORBaseUnknown_var& s : *siblings)
+          indexes[s.Identity()] = i++;
+      }
+      delete siblings;
+      it = indexes.find(node.Identity());
+    }
+    if (it != indexes.end())
+      index = it->second;
+  }
+  double x = 2.0 * QELPertParameters::PERT_GRID_CELL_SIZE * index;
+  double y = 0.0;
+  QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 0, QELIPertNode_var());
+  ext->SetProvisionalPosition(x, y);
+  return S_OK;
+}
