@@ -44,13 +44,6 @@ VORExtension* CreateTIEQELIPertWindowQELFpaProductFlowViewer() {
   return new TIEQELIPertWindowQELFpaProductFlowViewer();
 }
 
-const bool kTieRegistered = [] {
-  VORExtensionRegistry::Register(QELFpaProductFlowViewer::ClassName(), QELIPertWindow::IID(),
-                                 &CreateTIEQELIPertWindowQELFpaProductFlowViewer,
-                                 VORExtensionKind::Data);
-  return true;
-}();
-
 // Children of a graph node (a new list or null).
 VORListValVORBaseUnknown_var* ChildrenOf(VORBaseUnknown* node) {
   VORIGENode_var graphNode(node);
@@ -77,12 +70,17 @@ void AddNavigationItem(VORNotification* notification, const char* headerId) {
 
 }  // namespace
 
+void QELFpaProductFlowViewer::RegisterExtensions() {
+  VORExtensionRegistry::Register(QELFpaProductFlowViewer::ClassName(), QELIPertWindow::IID(),
+                                 &CreateTIEQELIPertWindowQELFpaProductFlowViewer,
+                                 VORExtensionKind::Data);
+}
+
 QELFpaProductFlowViewer::QELFpaProductFlowViewer(const VORString& name, VORFrmEditor* editor,
                                                  VORBaseUnknown_var& rootActivity)
     : VORFrmWindow(name, editor),
       _rootNode(rootActivity),
       _nodesForReArrangement(new VORListValVORBaseUnknown_var) {
-  (void)kTieRegistered;
   Trace().TraPrint("QELFpaProductFlowViewer::Constructor -->");
 
   _windowFrame = GetViewerFrame();

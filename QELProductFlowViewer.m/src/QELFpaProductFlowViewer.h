@@ -19,6 +19,8 @@ class QELFpaProductFlowViewer : public VORFrmWindow {
   // Joins the current layout, which takes the creator's reference.
   QELFpaProductFlowViewer(const VORString& name, VORFrmEditor* editor,
                           VORBaseUnknown_var& rootActivity);
+  // Registers the window's extensions (QELIPertWindow); called by the module's initialisation.
+  static void RegisterExtensions();
 
   VORBaseUnknown_var GetRootNode() const { return _rootNode; }
   void GetPertLevel(VORBaseUnknown_var& out) const { out = _rootNode; }

@@ -5,8 +5,14 @@
 #include <vector>
 
 #include "FuzzSupport.h"
+#include "VORModelInit.h"
 #include "VORDocument.h"
 #include "VORModelChecker.h"
+
+extern "C" int LLVMFuzzerInitialize(int*, char***) {
+  VORInitModel();
+  return 0;
+}
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, size_t size) {
   const std::string text(reinterpret_cast<const char*>(data), size);

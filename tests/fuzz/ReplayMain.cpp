@@ -9,8 +9,12 @@
 #include <vector>
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, size_t size);
+// Optional, as with libFuzzer: the target initialises the layers it uses.
+extern "C" int LLVMFuzzerInitialize(int* argc, char*** argv) __attribute__((weak));
 
 int main(int argc, char** argv) {
+  if (LLVMFuzzerInitialize != nullptr)
+    LLVMFuzzerInitialize(&argc, &argv);
   std::vector<std::filesystem::path> files;
   for (int i = 1; i < argc; ++i) {
     if (std::filesystem::is_directory(argv[i])) {

@@ -5,7 +5,13 @@
 #include <vector>
 
 #include "FuzzSupport.h"
+#include "VORFrameInit.h"
 #include "VORScript.h"
+
+extern "C" int LLVMFuzzerInitialize(int*, char***) {
+  VORInitFrame();
+  return 0;
+}
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, size_t size) {
   const std::string text(reinterpret_cast<const char*>(data), size);

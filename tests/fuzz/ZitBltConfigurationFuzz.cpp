@@ -7,6 +7,7 @@
 #include <string>
 
 #include "FuzzSupport.h"
+#include "VORModelInit.h"
 #include "QELZitBltConfiguration.h"
 
 namespace {
@@ -17,6 +18,11 @@ bool Same(const QELZitBltDefinition& a, const QELZitBltDefinition& b) {
          a.updateCmdName == b.updateCmdName && a.updateLoadModule == b.updateLoadModule;
 }
 }  // namespace
+
+extern "C" int LLVMFuzzerInitialize(int*, char***) {
+  VORInitModel();
+  return 0;
+}
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, size_t size) {
   const std::string path =

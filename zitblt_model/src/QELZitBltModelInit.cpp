@@ -3,6 +3,7 @@
 #include "QELEListZitBltItemStatePI.h"
 #include "QELEZitBltCBSubscriber.h"
 #include "QELEZitBltMgr.h"
+#include "QELScrollListScriptSteps.h"
 #include "QELZitBltScriptStep.h"
 #include "VORExtensionRegistry.h"
 
@@ -28,4 +29,5 @@ extern "C" void VORInitModule() {
       "ProductInput", QELIListZitBltItemState::IID(),
       []() -> VORExtension* { return new QELEListZitBltItemStatePI(); }, VORExtensionKind::Data);
   QELRegisterZitBltScriptStep();
+  QELRegisterScrollListScriptSteps();  // the list visualisation this module links
 }

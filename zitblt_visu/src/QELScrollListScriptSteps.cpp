@@ -1,9 +1,11 @@
 // Script steps that drive and print the ZitBlt lists of a chart without a screen: open and close
 // a ZitBlt, print a list, scroll it, open its button's context menu, show its balloon, click an
-// item, slide the ZitBlt round its node. Registered when the library loads.
+// item, slide the ZitBlt round its node. Registered by the ZitBlt model module's initialisation.
 #include <cstdio>
 #include <functional>
 #include <memory>
+
+#include "QELScrollListScriptSteps.h"
 
 #include "QELBaseScrollListZitBltRep.h"
 #include "QELIZitBltMgr.h"
@@ -318,25 +320,22 @@ bool Slide(VORDriver& driver, const Words& words, std::string& error) {
   return DriverStep(driver, driver.Drag(t.window, at.x, at.y, at.x + d[0], at.y + d[1]), error);
 }
 
-struct Registrar {
-  Registrar() {
-    VORScript::RegisterStep("expand", [](VORDriver& d, const Words& w, std::ostream&,
-                                         std::string& e) { return ClickButton(d, w, true, e); });
-    VORScript::RegisterStep("collapse", [](VORDriver& d, const Words& w, std::ostream&,
-                                           std::string& e) { return ClickButton(d, w, false, e); });
-    VORScript::RegisterStep("print list", PrintList);
-    VORScript::RegisterStep("scroll", [](VORDriver& d, const Words& w, std::ostream&,
-                                         std::string& e) { return Scroll(d, w, e); });
-    VORScript::RegisterStep("context-zitblt",
-                            [](VORDriver& d, const Words& w, std::ostream&, std::string& e) {
-                              return ContextZitBlt(d, w, e);
-                            });
-    VORScript::RegisterStep("balloon", Balloon);
-    VORScript::RegisterStep("pick-item", [](VORDriver& d, const Words& w, std::ostream&,
-                                            std::string& e) { return PickItem(d, w, e); });
-    VORScript::RegisterStep("slide", [](VORDriver& d, const Words& w, std::ostream&,
-                                        std::string& e) { return Slide(d, w, e); });
-  }
-};
-const Registrar registrar;
 }  // namespace
+
+void QELRegisterScrollListScriptSteps() {
+  VORScript::RegisterStep("expand", [](VORDriver& d, const Words& w, std::ostream&,
+                                       std::string& e) { return ClickButton(d, w, true, e); });
+  VORScript::RegisterStep("collapse", [](VORDriver& d, const Words& w, std::ostream&,
+                                         std::string& e) { return ClickButton(d, w, false, e); });
+  VORScript::RegisterStep("print list", PrintList);
+  VORScript::RegisterStep("scroll", [](VORDriver& d, const Words& w, std::ostream&,
+                                       std::string& e) { return Scroll(d, w, e); });
+  VORScript::RegisterStep("context-zitblt", [](VORDriver& d, const Words& w, std::ostream&,
+                                               std::string& e) { return ContextZitBlt(d, w, e); });
+  VORScript::RegisterStep("balloon", Balloon);
+  VORScript::RegisterStep("pick-item", [](VORDriver& d, const Words& w, std::ostream&,
+                                          std::string& e) { return PickItem(d, w, e); });
+  VORScript::RegisterStep("slide", [](VORDriver& d, const Words& w, std::ostream&, std::string& e) {
+    return Slide(d, w, e);
+  });
+}

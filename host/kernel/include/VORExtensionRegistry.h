@@ -1,5 +1,7 @@
 // Registry of extensions per (late type, interface). A lookup walks the late-type chain and,
 // when nothing is registered, loads the module that the module dictionary names for it.
+// Extensions are registered from a layer's VORInit<Layer>() or a module's VORInitModule(), never
+// from a static initialiser.
 #pragma once
 
 #include <string>
@@ -29,11 +31,3 @@ void ClearDictionary();
 // Drops cached look-up answers (late types changed).
 void ForgetAnswers();
 }  // namespace VORExtensionRegistry
-
-// Registers an extension class at module load time.
-#define VOR_REGISTER_EXTENSION(Class, LateType, Interface, Kind)                          \
-  static const bool vorRegistered_##Class##_##Interface = [] {                            \
-    VORExtensionRegistry::Register(                                                       \
-        LateType, Interface::IID(), []() -> VORExtension* { return new Class(); }, Kind); \
-    return true;                                                                          \
-  }()
