@@ -8,6 +8,7 @@
 
 #include "QELZitBltConfiguration.h"
 #include "StrX.h"
+#include "TempDir.h"
 #include "VORSettingRepository.h"
 
 namespace {
@@ -17,8 +18,7 @@ namespace cfg = QELZitBltConfiguration;
 class ZitBltConfigurationTest : public ::testing::Test {
  protected:
   void SetUp() override {
-    _dir = std::filesystem::temp_directory_path() / ("pfv-zitblt-" + std::to_string(::getpid()));
-    std::filesystem::remove_all(_dir);
+    _dir = _temp.Path();
     std::filesystem::create_directories(_dir / "first");
     std::filesystem::create_directories(_dir / "second");
     const char* old = getenv("VORStartupPath");
@@ -33,7 +33,6 @@ class ZitBltConfigurationTest : public ::testing::Test {
     cfg::ForgetForTests();
     VORSettingRepository::Forget();
     setenv("VORStartupPath", _oldStartup.c_str(), 1);
-    std::filesystem::remove_all(_dir);
   }
   std::string Write(const std::string& relative, const std::string& content) {
     std::ofstream(_dir / relative) << content;
@@ -48,6 +47,7 @@ class ZitBltConfigurationTest : public ::testing::Test {
     return names;
   }
 
+  TempDir _temp;
   std::filesystem::path _dir;
   std::string _oldStartup;
 };
@@ -129,6 +129,13 @@ TEST_F(ZitBltConfigurationTest, ADoctypeIsAcceptedWhenItNamesNothingExternal) {
   VORIDOMDocument_var doc;
   ASSERT_TRUE(cfg::LoadConfiguration(doc));
   EXPECT_EQ(cfg::ReadDefinitions(doc, VORUnicodeString("aaaaaaaaaaaa")).size(), 1u);
+  // Markup characters inside the internal subset's literals and comments do not end it.
+  cfg::ForgetForTests();
+  Write("first/zitbltcfg.xml",
+        "<?xml version=\"1.0\"?><!DOCTYPE z [<!-- <z> ] --><!ENTITY a 'x>]y'>]>"
+        "<z><ActivityZitBlt ActivityType=\"&a;\"><ZitBlt Name=\"N\"/></ActivityZitBlt></z>");
+  ASSERT_TRUE(cfg::LoadConfiguration(doc));
+  EXPECT_EQ(cfg::ReadDefinitions(doc, VORUnicodeString("x>]y")).size(), 1u);
 
   // An external DTD, an external entity (used or only declared) and an entity bomb are refused,
   // quietly, and nothing of the named file gets in.
