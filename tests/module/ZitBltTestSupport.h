@@ -13,15 +13,14 @@
 #include <vector>
 
 #include "QELZitBltConfiguration.h"
+#include "TempDir.h"
 #include "VORCommand.h"
 #include "VORDeferredDeletion.h"
 #include "VORManipulator.h"
 
 class ZitBltStartupDir {
  public:
-  ZitBltStartupDir() {
-    _dir = std::filesystem::temp_directory_path() / ("pfv-zitblt-" + std::to_string(::getpid()));
-    std::filesystem::remove_all(_dir);
+  ZitBltStartupDir() : _dir(_temp.Path()) {
     std::filesystem::create_directories(_dir / "icons");
     const char* old = getenv("VORStartupPath");
     _old = old ? old : "";
@@ -31,7 +30,6 @@ class ZitBltStartupDir {
   ~ZitBltStartupDir() {
     QELZitBltConfiguration::ForgetForTests();
     setenv("VORStartupPath", _old.c_str(), 1);
-    std::filesystem::remove_all(_dir);
   }
   // A red icon of width x height pixels (4 pixels per model unit).
   void WriteIcon(const std::string& name, int width, int height) const {
@@ -44,6 +42,7 @@ class ZitBltStartupDir {
   const std::filesystem::path& Path() const { return _dir; }
 
  private:
+  TempDir _temp;
   std::filesystem::path _dir;
   std::string _old;
 };

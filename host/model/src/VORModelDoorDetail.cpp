@@ -176,14 +176,6 @@ VORGraphNodeImpl* MakeNode(const std::string& type) {
   return new VORActivityImpl(type);
 }
 
-bool IsInside(VORProductImpl* product, VORProductImpl* ancestor) {
-  for (VORProductImpl* p = product; p != nullptr; p = p->father) {
-    if (p == ancestor)
-      return true;
-  }
-  return false;
-}
-
 bool ReachesComponent(VORModelObject* from, VORModelObject* target) {
   std::vector<VORModelObject*> stack{from};
   std::unordered_set<VORModelObject*> seen;

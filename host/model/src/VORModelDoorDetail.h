@@ -74,7 +74,6 @@ void DetachEverything(const std::vector<VORModelObject*>& objects, Detached& d);
 void ReattachEverything(const Detached& d);
 
 VORGraphNodeImpl* MakeNode(const std::string& type);
-bool IsInside(VORProductImpl* product, VORProductImpl* ancestor);
 // True when target is component (directly or not) of from.
 bool ReachesComponent(VORModelObject* from, VORModelObject* target);
 // The product or assembly behind object, null for anything else.

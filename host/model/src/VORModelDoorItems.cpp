@@ -245,7 +245,7 @@ HRESULT VORModelDoor::RemoveProduct(VORBaseUnknown* productObject) {
 HRESULT VORModelDoor::ReparentProduct(VORBaseUnknown* productObject, VORBaseUnknown* newFather) {
   auto* p = VORImplOf<VORProductImpl>(productObject, Data());
   auto* f = VORImplOf<VORProductImpl>(newFather, Data());
-  if (p == nullptr || f == nullptr || IsInside(f, p))
+  if (p == nullptr || f == nullptr || VORIsInside<VORProductImpl>(f, p))
     return E_INVALIDARG;
   if (p->father == f)
     return S_FALSE;

@@ -223,15 +223,6 @@ class VORActivityImpl : public VORGraphNodeImpl,
   ~VORActivityImpl() override;
 };
 
-// True when node is ancestor or lies below it (the one walk up the process tree).
-inline bool VORIsInsideNode(const VORGraphNodeImpl* node, const VORGraphNodeImpl* ancestor) {
-  for (const VORGraphNodeImpl* n = node; n != nullptr; n = n->father) {
-    if (n == ancestor)
-      return true;
-  }
-  return false;
-}
-
 // The item bookkeeping shared by stations and groupings.
 class VORBIWItemInfoImpl : public virtual QELIBIWItemInfo {
  public:
@@ -511,3 +502,14 @@ T* VORKindCast(VORModelObject* object) {
 // Helpers shared by the implementation files.
 VORListValVORBaseUnknown_var* VORNewList();
 bool VORMatchesFilter(VORModelObject* object, const char* filter);
+
+// True when node is ancestor or lies below it: the one walk up a tree of the model (activities
+// and their fathers, products and theirs).
+template <class Node>
+bool VORIsInside(const Node* node, const Node* ancestor) {
+  for (const Node* n = node; n != nullptr; n = n->father) {
+    if (n == ancestor)
+      return true;
+  }
+  return false;
+}

@@ -154,5 +154,5 @@ bool VORBIWItemInfoImpl::IsInHierarchyOf(VORBaseUnknown* target) {
   VORActivityImpl* self = Self();
   if (t == nullptr || t->data != self->data)
     return false;
-  return VORIsInsideNode(self, t) || VORIsInsideNode(t, self);
+  return VORIsInside<VORGraphNodeImpl>(self, t) || VORIsInside<VORGraphNodeImpl>(t, self);
 }

@@ -100,7 +100,7 @@ bool VORSPPCopyServices::CanPasteInto(const VORListValVORBaseUnknown_var& source
     return false;
   for (const VORBaseUnknown_var& s : sources) {
     auto* a = VORImplOf<VORActivityImpl>(s.get(), t->data);
-    if (a == nullptr || a->father == nullptr || VORIsInsideNode(t, a))
+    if (a == nullptr || a->father == nullptr || VORIsInside<VORGraphNodeImpl>(t, a))
       return false;
   }
   return true;

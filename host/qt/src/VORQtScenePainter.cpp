@@ -17,6 +17,42 @@
 
 namespace {
 
+// Marker symbols of VOR2DPointRep.
+constexpr int kMarkerPlus = 1;
+constexpr int kMarkerCross = 2;
+constexpr int kMarkerStar = 3;  // plus and cross
+constexpr int kMarkerDisc = 4;
+constexpr int kMarkerSquare = 5;
+constexpr int kMarkerTriangle = 6;
+// The smallest half size of a marker in pixels, so that it stays visible when zoomed out.
+constexpr double kMinMarkerHalfPixels = 1.5;
+// The dot (symbol 0): its radius as a share of the half size, plus a fixed part in pixels.
+constexpr double kDotRadiusShare = 0.3;
+constexpr double kDotRadiusPixels = 0.5;
+
+// The cached pen width after the pen was changed behind SetPen: the next SetPen sets it.
+constexpr double kPenUnknown = -1.0;
+// A selected or preselected item is drawn this many pixels wider.
+constexpr double kHighlightExtraWidth = 1.0;
+// Line widths and markers may stick out of an item's model box by a few pixels.
+constexpr double kCullMarginPixels = 4.0;
+// Grid lines closer than this (pixels) would only grey the background: no grid.
+constexpr double kMinGridCellPixels = 6.0;
+// Fonts are cached per tenth of a pixel of height.
+constexpr double kFontKeyStepsPerPixel = 10.0;
+// Qt measures angles in sixteenths of a degree.
+constexpr double kQtAngleUnitsPerRadian = 180.0 / std::numbers::pi * 16.0;
+// An arc spanning a full turn within this (radians) is drawn as a whole ellipse.
+constexpr double kFullTurnTolerance = 1e-6;
+// Greeked text: a bar from 0.7 to 0.2 of the text height above the baseline, at half the
+// text's opacity, never thinner or narrower than half a pixel.
+constexpr double kGreekBarTop = 0.7;
+constexpr double kGreekBarHeight = 0.5;
+constexpr double kGreekMinPixels = 0.5;
+
+const QColor kPreselectedColor(240, 140, 20);  // orange
+const QColor kSelectedColor(220, 30, 30);      // red
+
 QColor ToQColor(const VORColorRGB& c, int alpha) {
   return QColor(c.r, c.g, c.b, std::clamp(alpha, 0, 255));
 }
@@ -50,11 +86,11 @@ bool IsAxisAlignedRectangle(const std::vector<VORMathPoint2D>& p) {
 }  // namespace
 
 QColor VORQtPreselectedColor() {
-  return QColor(240, 140, 20);
+  return kPreselectedColor;
 }
 
 QColor VORQtSelectedColor() {
-  return QColor(220, 30, 30);
+  return kSelectedColor;
 }
 
 VORQtViewTransform VORQtViewTransform::FromViewer(const VORViewer& viewer) {
@@ -102,7 +138,7 @@ VORBox2D VORQtViewTransform::ToModel(const QRectF& rect) const {
 VORQtScenePainter::VORQtScenePainter() = default;
 
 const QFont& VORQtScenePainter::FontFor(double pixelHeight) {
-  const int key = static_cast<int>(std::lround(pixelHeight * 10.0));
+  const int key = static_cast<int>(std::lround(pixelHeight * kFontKeyStepsPerPixel));
   auto it = _fonts.find(key);
   if (it != _fonts.end())
     return it->second;
@@ -145,7 +181,7 @@ void VORQtScenePainter::PaintBackground(QPainter& painter, const QRectF& area, f
 
 void VORQtScenePainter::PaintGrid(QPainter& painter, const VORQtViewTransform& view,
                                   const QRectF& area, double cellSize, const QColor& color) {
-  if (!(cellSize > 0.0) || cellSize * view.scale < 6.0 || area.isEmpty())
+  if (!(cellSize > 0.0) || cellSize * view.scale < kMinGridCellPixels || area.isEmpty())
     return;
   const VORBox2D box = view.ToModel(area);
   QPen pen(color, 0.0, Qt::DotLine);
@@ -168,9 +204,9 @@ VORQtPaintStatistics VORQtScenePainter::Paint(QPainter& painter, const VORRender
   QRectF target = area;
   if (target.isEmpty())
     target = QRectF(0.0, 0.0, view.width, view.height);
-  // Line widths and markers may stick out of an item's model box by a few pixels.
-  const VORBox2D visible = view.ToModel(target.adjusted(-4.0, -4.0, 4.0, 4.0));
-  _penWidth = -1.0;
+  const VORBox2D visible = view.ToModel(target.adjusted(-kCullMarginPixels, -kCullMarginPixels,
+                                                        kCullMarginPixels, kCullMarginPixels));
+  _penWidth = kPenUnknown;
   _brushSet = false;
   painter.setPen(Qt::NoPen);
   painter.setBrush(Qt::NoBrush);
@@ -191,10 +227,10 @@ void VORQtScenePainter::PaintItem(QPainter& painter, const VORRenderItem& item,
   double width = item.thickness;
   if (item.highlight & VORHighlightSelected) {
     stroke = VORQtSelectedColor();
-    width += 1.0;
+    width += kHighlightExtraWidth;
   } else if (item.highlight & VORHighlightPreselected) {
     stroke = VORQtPreselectedColor();
-    width += 1.0;
+    width += kHighlightExtraWidth;
   }
   const QColor fill = ToQColor(item.color, item.alpha);
   auto toPixels = [&](const std::vector<VORMathPoint2D>& points) {
@@ -240,7 +276,7 @@ void VORQtScenePainter::PaintItem(QPainter& painter, const VORRenderItem& item,
       toPixels(item.points);
       if (item.filled) {
         painter.setPen(Qt::NoPen);
-        _penWidth = -1.0;
+        _penWidth = kPenUnknown;
         SetBrush(painter, fill);
         painter.drawPolygon(_points.data(), static_cast<int>(_points.size()));
       }
@@ -259,17 +295,17 @@ void VORQtScenePainter::PaintItem(QPainter& painter, const VORRenderItem& item,
       const QRectF rect(view.PixelX(item.points[0].x) - r, view.PixelY(item.points[0].y) - r,
                         2.0 * r, 2.0 * r);
       const double span = item.endAngle - item.startAngle;
-      const int start16 =
-          static_cast<int>(std::lround(item.startAngle * 180.0 / std::numbers::pi * 16.0));
-      const int span16 = static_cast<int>(std::lround(span * 180.0 / std::numbers::pi * 16.0));
+      const int start16 = static_cast<int>(std::lround(item.startAngle * kQtAngleUnitsPerRadian));
+      const int span16 = static_cast<int>(std::lround(span * kQtAngleUnitsPerRadian));
+      const bool fullTurn = span >= 2.0 * std::numbers::pi - kFullTurnTolerance;
       SetPen(painter, stroke, width, item.lineType);
       if (item.closed) {
         SetBrush(painter, fill);
-        if (span >= 2.0 * std::numbers::pi - 1e-6)
+        if (fullTurn)
           painter.drawEllipse(rect);
         else
           painter.drawChord(rect, start16, span16);
-      } else if (span >= 2.0 * std::numbers::pi - 1e-6) {
+      } else if (fullTurn) {
         painter.setBrush(Qt::NoBrush);
         _brushSet = false;
         painter.drawEllipse(rect);
@@ -283,34 +319,35 @@ void VORQtScenePainter::PaintItem(QPainter& painter, const VORRenderItem& item,
         return;
       const double x = view.PixelX(item.points[0].x);
       const double y = view.PixelY(item.points[0].y);
-      const double h = std::max(1.5, item.markerSize * view.scale * 0.5);
+      const double h = std::max(kMinMarkerHalfPixels, item.markerSize * view.scale / 2.0);
       const bool highlighted = item.highlight != VORHighlightNone;
       switch (item.marker) {
-        case 4:
+        case kMarkerDisc:
           painter.setPen(Qt::NoPen);
-          _penWidth = -1.0;
+          _penWidth = kPenUnknown;
           SetBrush(painter, highlighted ? stroke : fill);
           painter.drawEllipse(QPointF(x, y), h, h);
           return;
-        case 5:
+        case kMarkerSquare:
           painter.fillRect(QRectF(x - h, y - h, 2 * h, 2 * h), highlighted ? stroke : fill);
           return;
-        case 6: {
+        case kMarkerTriangle: {
           const QPointF triangle[3] = {{x - h, y + h}, {x + h, y + h}, {x, y - h}};
           painter.setPen(Qt::NoPen);
-          _penWidth = -1.0;
+          _penWidth = kPenUnknown;
           SetBrush(painter, highlighted ? stroke : fill);
           painter.drawPolygon(triangle, 3);
           return;
         }
         default: {
-          const bool plus = item.marker == 1 || item.marker == 3;
-          const bool cross = item.marker == 2 || item.marker == 3;
+          const bool plus = item.marker == kMarkerPlus || item.marker == kMarkerStar;
+          const bool cross = item.marker == kMarkerCross || item.marker == kMarkerStar;
           if (!plus && !cross) {
             painter.setPen(Qt::NoPen);
-            _penWidth = -1.0;
+            _penWidth = kPenUnknown;
             SetBrush(painter, stroke);
-            painter.drawEllipse(QPointF(x, y), h * 0.3 + 0.5, h * 0.3 + 0.5);
+            const double r = h * kDotRadiusShare + kDotRadiusPixels;
+            painter.drawEllipse(QPointF(x, y), r, r);
             return;
           }
           SetPen(painter, stroke, width, VORLineSolid);
@@ -339,7 +376,8 @@ void VORQtScenePainter::PaintItem(QPainter& painter, const VORRenderItem& item,
         const double w = item.box.Width() * view.scale;
         QColor bar = colour;
         bar.setAlpha(colour.alpha() / 2);
-        painter.fillRect(QRectF(left, baseline - h * 0.7, std::max(w, 0.5), std::max(h * 0.5, 0.5)),
+        painter.fillRect(QRectF(left, baseline - h * kGreekBarTop, std::max(w, kGreekMinPixels),
+                                std::max(h * kGreekBarHeight, kGreekMinPixels)),
                          bar);
         return;
       }
