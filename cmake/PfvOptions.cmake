@@ -63,7 +63,7 @@ endfunction()
 # cases ctest lists one by one, run with the bundled resources and the built modules. Its main
 # initialises the named platform layers (Kernel, Model, ..., Pert, Qt) before any test. The
 # environment is given by a launcher rather than by test properties, so that listing the cases
-# (right after linking) sees the same environment as running them. Cases of one executable share
+# sees the same environment as running them. Cases of one executable share
 # a settings folder, so they never run at once.
 function(pfv_test name)
   cmake_parse_arguments(ARG "" "" "SOURCES;LIBS;INIT" ${ARGN})
@@ -72,8 +72,10 @@ function(pfv_test name)
   target_link_libraries(${name} PRIVATE pfv_warnings GTest::gtest GTest::gmock ${ARG_LIBS})
   set_target_properties(${name} PROPERTIES CROSSCOMPILING_EMULATOR
     "${CMAKE_COMMAND};-E;env;VORStartupPath=${PFV_RESOURCE_DIR};VOR_MODULE_PATH=${PFV_MODULE_DIR};VOR_USER_SETTINGS_DIR=${CMAKE_BINARY_DIR}/test-settings/${name};PFV_TEST_DATA=${CMAKE_SOURCE_DIR}/tests/data;PFV_EXAMPLES=${CMAKE_SOURCE_DIR}/examples;QT_QPA_PLATFORM=offscreen;ASAN_OPTIONS=detect_leaks=1")
-  gtest_discover_tests(${name} TEST_PREFIX "${name}." DISCOVERY_TIMEOUT 120
-                       PROPERTIES RESOURCE_LOCK ${name})
+  # Cases are listed when ctest starts (not after linking), with a generous time-out: a
+  # sanitizer build starts slowly on a busy machine.
+  gtest_discover_tests(${name} TEST_PREFIX "${name}." DISCOVERY_MODE PRE_TEST
+                       DISCOVERY_TIMEOUT 120 PROPERTIES RESOURCE_LOCK ${name})
 endfunction()
 
 # pfv_bench(<name> SOURCES ... LIBS ... [INIT <layer>...]): a Google Benchmark program whose main

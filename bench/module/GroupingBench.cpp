@@ -76,4 +76,3 @@ void BM_GroupConsecutiveStations(benchmark::State& state) {
 }  // namespace
 
 BENCHMARK(BM_GroupConsecutiveStations)->Arg(10000)->Unit(benchmark::kMillisecond)->Iterations(5);
-

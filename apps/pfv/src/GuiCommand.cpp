@@ -162,8 +162,7 @@ class PdfBook : public PfvBookWriter {
   VORQtPdfBook _book;
 };
 bool WritePDF(VORViewer& viewer, const std::string& path, std::string& error) {
-  return VORQtPdfBook::WriteChart(viewer, std::filesystem::path(path).stem().string(), path,
-                                  error);
+  return VORQtPdfBook::WriteChart(viewer, std::filesystem::path(path).stem().string(), path, error);
 }
 
 }  // namespace
