@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <string>
 #include <vector>
 
@@ -120,6 +121,60 @@ TEST(ISOTest, HoldsEachModelOnceAndForgetsViewersOnRequest) {
   EXPECT_TRUE(iso->GetViewers().empty());
   EXPECT_TRUE(iso->RemoveElement(model.get()));
   EXPECT_FALSE(iso->IsPresent(model.get()));
+}
+
+TEST(ISOTest, KeepsTheOrderOfAPlainListOverManyRandomChangesAndHoldsNoRemovedModel) {
+  // Reference: the models in the order they were added, with removal by a linear scan.
+  auto iso = Make<VORISO>();
+  std::vector<VORHandle<TestThing>> objects;
+  for (int i = 0; i < 40; ++i)
+    objects.push_back(Make<TestThing>());
+  std::vector<VORBaseUnknown*> reference;
+  unsigned state = 4711;
+  auto next = [&](unsigned n) {
+    state = state * 1103515245u + 12345u;
+    return (state >> 8) % n;
+  };
+  for (int step = 0; step < 4000; ++step) {
+    VORBaseUnknown* model = objects[next(40)].get();
+    const auto at = std::find(reference.begin(), reference.end(), model);
+    switch (next(7)) {
+      case 0:
+      case 1:
+      case 2:
+        EXPECT_EQ(iso->AddElement(model), at == reference.end());
+        if (at == reference.end())
+          reference.push_back(model);
+        break;
+      case 3:
+      case 4:
+      case 5:
+        EXPECT_EQ(iso->RemoveElement(model), at != reference.end());
+        if (at != reference.end())
+          reference.erase(at);
+        break;
+      default:
+        if (next(30) == 0) {
+          iso->Empty();
+          reference.clear();
+        }
+    }
+    ASSERT_EQ(iso->IsPresent(model), std::count(reference.begin(), reference.end(), model) == 1);
+    if (next(4) != 0)
+      continue;
+    std::vector<VORBaseUnknown*> listed;
+    for (const VORBaseUnknown_var& m : iso->GetElements())
+      listed.push_back(m.get());
+    ASSERT_EQ(listed, reference) << "step " << step;
+  }
+  // Held by the test, and by the set only while listed, even after the listing was read.
+  (void)iso->GetElements();
+  for (const auto& object : objects) {
+    const bool listed = iso->IsPresent(object.get());
+    iso->RemoveElement(object.get());
+    EXPECT_EQ(object->RefCount(), 1u) << (listed ? "removed" : "never listed");
+  }
+  EXPECT_EQ(iso->GetElements().Size(), 0);
 }
 
 TEST(CSOTest, TheLeafIndexAnswersLikeAPlainScanOverManyRandomChanges) {

@@ -3,8 +3,8 @@
 // not held; a viewer removes itself before it dies.
 #pragma once
 
-#include <unordered_set>
-
+#include <cstddef>
+#include <unordered_map>
 #include <vector>
 
 #include "VOREventPublisher.h"
@@ -20,7 +20,8 @@ class VORISO : public VORBaseUnknown {
   bool RemoveElement(VORBaseUnknown* model);
   // By identity, without a scan: a chart adds several models per node.
   bool IsPresent(VORBaseUnknown* model) const;
-  const VORListValVORBaseUnknown_var& GetElements() const { return _models; }
+  // The models in the order they were added. Built again on the first call after a change.
+  const VORListValVORBaseUnknown_var& GetElements() const;
   void Empty();
 
   void AddViewer(VORBaseUnknown* viewer);
@@ -34,8 +35,15 @@ class VORISO : public VORBaseUnknown {
   ~VORISO() override;
 
  private:
-  VORListValVORBaseUnknown_var _models;
-  std::unordered_set<VORBaseUnknown*> _present;  // identities of _models
+  // Adding and removing cost O(1) (a removed model leaves a null slot, dropped at the next
+  // compaction), so that removing the ZitBlts of many nodes of a large chart stays linear.
+  void Compact();
+  void Invalidate();
+
+  std::vector<VORBaseUnknown_var> _slots;
+  std::unordered_map<VORBaseUnknown*, std::size_t> _slotOf;  // identity -> index in _slots
+  mutable VORListValVORBaseUnknown_var _models;              // _slots without the holes
+  mutable bool _modelsValid = true;
   std::vector<VORBaseUnknown*> _viewers;
   VORHandle<VOREventPublisher> _publisher;
 };

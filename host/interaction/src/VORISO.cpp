@@ -1,35 +1,77 @@
 #include "VORISO.h"
 
+#include <algorithm>
+
 VORISO::VORISO() : _publisher(VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher(this))) {}
 
 VORISO::~VORISO() = default;
 
 bool VORISO::IsPresent(VORBaseUnknown* model) const {
-  return model != nullptr && _present.count(model->GetIdentity()) != 0;
+  return model != nullptr && _slotOf.count(model->GetIdentity()) != 0;
+}
+
+const VORListValVORBaseUnknown_var& VORISO::GetElements() const {
+  if (!_modelsValid) {
+    _models.RemoveAll();
+    _models.Reserve(static_cast<int>(_slotOf.size()));
+    for (const VORBaseUnknown_var& model : _slots) {
+      if (model)
+        _models.Append(model);
+    }
+    _modelsValid = true;
+  }
+  return _models;
+}
+
+void VORISO::Invalidate() {
+  // The cached list must not keep removed models alive; clearing it costs what building it did.
+  if (_modelsValid)
+    _models.RemoveAll();
+  _modelsValid = false;
+}
+
+void VORISO::Compact() {
+  std::size_t kept = 0;
+  for (VORBaseUnknown_var& model : _slots) {
+    if (!model)
+      continue;
+    _slotOf[model->GetIdentity()] = kept;
+    _slots[kept++] = std::move(model);
+  }
+  _slots.resize(kept);
 }
 
 bool VORISO::AddElement(VORBaseUnknown* model) {
   if (model == nullptr || IsPresent(model))
     return false;
-  _models.Append(VORBaseUnknown_var(model));
-  _present.insert(model->GetIdentity());
+  _slotOf.emplace(model->GetIdentity(), _slots.size());
+  _slots.emplace_back(model);
+  Invalidate();
   _publisher->Dispatch("VORISOAdd");
   return true;
 }
 
 bool VORISO::RemoveElement(VORBaseUnknown* model) {
-  if (!IsPresent(model) || _models.RemoveValue(VORBaseUnknown_var(model)) == 0)
+  auto it = model == nullptr ? _slotOf.end() : _slotOf.find(model->GetIdentity());
+  if (it == _slotOf.end())
     return false;
-  _present.erase(model->GetIdentity());
+  // Released after the bookkeeping: the model may be the last reference to its rep.
+  VORBaseUnknown_var removed = std::move(_slots[it->second]);
+  _slotOf.erase(it);
+  if (_slots.size() > 2 * _slotOf.size() + 16)
+    Compact();
+  Invalidate();
   _publisher->Dispatch("VORISORemove");
   return true;
 }
 
 void VORISO::Empty() {
-  if (_models.IsEmpty())
+  if (_slotOf.empty())
     return;
-  _models.RemoveAll();
-  _present.clear();
+  std::vector<VORBaseUnknown_var> removed;
+  removed.swap(_slots);
+  _slotOf.clear();
+  Invalidate();
   _publisher->Dispatch("VORISORemove");
 }
 
