@@ -4,6 +4,8 @@
 
 #include <sys/stat.h>
 
+#include <cmath>
+
 #include <xercesc/dom/DOM.hpp>
 
 #include "VORXercesPlatform.h"
@@ -97,6 +99,41 @@ TEST(DoorTest, RefusedChangesLeaveTheDocumentAndItsListenersUntouched) {
   EXPECT_TRUE(rec.Take().empty());
   EXPECT_FALSE(l.doc->IsModified());
   EXPECT_EQ(l.doc->SaveToString(), before);
+}
+
+TEST(DoorTest, NonFiniteNumbersAreRefusedAsTheReaderRefusesThem) {
+  SmallLine l;
+  VORModelDoor& door = l.doc->GetDoor();
+  door.SetPertPosition(l.s1, true, 12.5, 37.5);
+  door.SetUserAttribute(l.s1, "Cost", VORAttributeValue::Double(2.5));
+  const std::string before = l.doc->SaveToString();
+  const long changes = door.ChangeCount();
+  VORChangeLog log;
+  door.SetRecorder(&log);
+  for (const double bad : {std::nan(""), HUGE_VAL, -HUGE_VAL}) {
+    SCOPED_TRACE(bad);
+    EXPECT_EQ(door.SetActivityTime(l.s1, bad), E_INVALIDARG);
+    EXPECT_EQ(door.SetStationCycleTime(l.s1, bad), E_INVALIDARG);
+    EXPECT_EQ(door.SetPertPosition(l.s1, true, bad, 1), E_INVALIDARG);
+    EXPECT_EQ(door.SetPertPosition(l.s1, true, 1, bad), E_INVALIDARG);
+    EXPECT_EQ(door.SetPertNodeSize(l.s1, bad, 1), E_INVALIDARG);
+    EXPECT_EQ(door.SetPertNodeSize(l.s1, 1, bad), E_INVALIDARG);
+    EXPECT_EQ(door.SetUserAttribute(l.s1, "Cost", VORAttributeValue::Double(bad)), E_INVALIDARG);
+    EXPECT_EQ(door.SetHubAttribute(l.s1, "weight", VORAttributeValue::Double(bad)), E_INVALIDARG);
+    // The same through the interfaces that planners' commands use.
+    EXPECT_EQ(VORISPPAbstractActivity_var(l.s2)->SetActivityTime(bad), E_INVALIDARG);
+    VORIGraphNodeLayout_var(l.s2)->SetPertPosition(bad, 0);
+  }
+  door.SetRecorder(nullptr);
+  EXPECT_EQ(door.ChangeCount(), changes);
+  EXPECT_TRUE(log.IsEmpty());
+  EXPECT_EQ(l.doc->SaveToString(), before);
+  std::string error;
+  EXPECT_TRUE(VORProcess_var::Adopt(VORProcess::LoadFromString(before, "again.pprx", error)))
+      << error;
+  // Forgetting a position takes no coordinates: whatever they hold is not stored.
+  EXPECT_EQ(door.SetPertPosition(l.s1, false, std::nan(""), HUGE_VAL), S_OK);
+  EXPECT_NE(l.doc->SaveToString(), before);
 }
 
 TEST(DoorTest, HandlesOutliveTheirDocumentWithoutDanglingReferences) {

@@ -148,11 +148,15 @@ HRESULT VORModelDoor::SetLabel(VORBaseUnknown* nodeObject, const VORUnicodeStrin
 }
 
 HRESULT VORModelDoor::SetActivityTime(VORBaseUnknown* activityObject, double time) {
+  if (!IsFinite(time))
+    return E_INVALIDARG;
   return SetScalar(VORImplOf<VORActivityImpl>(activityObject, Data()), &VORActivityImpl::time, time,
                    "time", &VORModelDoor::SetActivityTime);
 }
 
 HRESULT VORModelDoor::SetStationCycleTime(VORBaseUnknown* stationObject, double time) {
+  if (!IsFinite(time))
+    return E_INVALIDARG;
   return SetScalar(VORImplOf<VORStationImpl>(stationObject, Data()),
                    &VORActivityImpl::stationCycleTime, time, "cycletime",
                    &VORModelDoor::SetStationCycleTime);
@@ -160,7 +164,7 @@ HRESULT VORModelDoor::SetStationCycleTime(VORBaseUnknown* stationObject, double 
 
 HRESULT VORModelDoor::SetPertPosition(VORBaseUnknown* nodeObject, bool has, double x, double y) {
   auto* n = VORImplOf<VORGraphNodeImpl>(nodeObject, Data());
-  if (n == nullptr)
+  if (n == nullptr || (has && !(IsFinite(x) && IsFinite(y))))
     return E_INVALIDARG;
   if (!has) {
     x = 0;
@@ -189,7 +193,7 @@ HRESULT VORModelDoor::SetPertNodeState(VORBaseUnknown* nodeObject, int state) {
 
 HRESULT VORModelDoor::SetPertNodeSize(VORBaseUnknown* nodeObject, double w, double h) {
   auto* n = VORImplOf<VORGraphNodeImpl>(nodeObject, Data());
-  if (n == nullptr || w < 0 || h < 0)
+  if (n == nullptr || !(IsFinite(w) && IsFinite(h)) || w < 0 || h < 0)
     return E_INVALIDARG;
   if (n->width == w && n->height == h)
     return S_OK;
@@ -206,7 +210,7 @@ HRESULT VORModelDoor::SetPertNodeSize(VORBaseUnknown* nodeObject, double w, doub
 HRESULT VORModelDoor::SetUserAttribute(VORBaseUnknown* activityObject, const VORUnicodeString& name,
                                        const VORAttributeValue& value) {
   auto* a = VORImplOf<VORActivityImpl>(activityObject, Data());
-  if (a == nullptr || name.IsEmpty())
+  if (a == nullptr || name.IsEmpty() || !IsFinite(value))
     return E_INVALIDARG;
   const std::string key = name.ConvertToUTF8();
   auto it = a->attributes.find(key);

@@ -2,6 +2,7 @@
 #include "VORModelDoorDetail.h"
 
 #include <algorithm>
+#include <cmath>
 #include <unordered_set>
 
 #include "VORLateTypes.h"
@@ -161,6 +162,14 @@ void ReattachEverything(const Detached& d) {
     ReattachLink(*it);
   for (auto it = d.vias.rbegin(); it != d.vias.rend(); ++it)
     it->first->out[it->second.first].via = it->second.second.get();
+}
+
+bool IsFinite(double value) {
+  return std::isfinite(value);
+}
+
+bool IsFinite(const VORAttributeValue& value) {
+  return value.type != VORAttributeDouble || std::isfinite(value.doubleValue);
 }
 
 VORGraphNodeImpl* MakeNode(const std::string& type) {

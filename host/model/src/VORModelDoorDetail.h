@@ -73,6 +73,11 @@ struct Detached {
 void DetachEverything(const std::vector<VORModelObject*>& objects, Detached& d);
 void ReattachEverything(const Detached& d);
 
+// The values a document can hold: no NaN or infinity (the reader refuses them too, so that
+// what is saved can be opened again).
+bool IsFinite(double value);
+bool IsFinite(const VORAttributeValue& value);
+
 VORGraphNodeImpl* MakeNode(const std::string& type);
 // True when target is component (directly or not) of from.
 bool ReachesComponent(VORModelObject* from, VORModelObject* target);

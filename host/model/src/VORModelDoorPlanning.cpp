@@ -146,7 +146,7 @@ HRESULT VORModelDoor::RemovePlanTypeRelation(VORBaseUnknown* fromObject,
 HRESULT VORModelDoor::SetHubAttribute(VORBaseUnknown* object, const VORUnicodeString& name,
                                       const VORAttributeValue& value) {
   auto* o = VORImplOf<VORModelObject>(object, Data());
-  if (o == nullptr || name.IsEmpty())
+  if (o == nullptr || name.IsEmpty() || !IsFinite(value))
     return E_INVALIDARG;
   auto& records = Data()->hubObjects;
   auto it = records.find(o->id);
