@@ -304,3 +304,75 @@ TEST_F(StateCommandTest, AnAgentAcceptedBeforeItsStateIsCurrentFiresWhenTheState
   EXPECT_TRUE(waiting->IsRunning());
   EXPECT_EQ(waiting->GetCurrentState()->GetName().str(), "Close");
 }
+
+namespace {
+// Collects stations with one repeated agent that takes the selection when it starts, like the
+// grouping command of the viewer.
+class CollectStations : public VORStateCommand {
+ public:
+  CollectStations() : VORStateCommand("CollectStations") {}
+  void BuildGraph() override {
+    _collect = VORPathElementAgent_var::Adopt(new VORPathElementAgent("Collect"));
+    _collect->SetElementType<ITestStation>();
+    _collect->SetBehavior(8652800);
+    _collect->SetFilter(VORMethodFilter(this, &CollectStations::OnlyStations));
+    _collect->AddCSOClient(this);
+    VORDialogState* state = GetInitialState("Collect");
+    state->AddDialogAgent(_collect);
+    AddTransition(state, state, IsOutputSetCondition(_collect),
+                  Action(this, &CollectStations::Again));
+  }
+  bool OnlyStations(VORDialogAgent* agent, void*) {
+    ITestStation_var station(agent->GetValue());
+    return station && station->Kind() == "station";
+  }
+  bool Again(void*) {
+    _collect->Reset();
+    return true;
+  }
+
+ private:
+  VORPathElementAgent_var _collect;
+};
+}  // namespace
+
+TEST_F(StateCommandTest, RepeatedPicksStartANewSelectionOnlyWhenTheAgentTookNoneOfTheOldOne) {
+  auto leaves = [this] {
+    std::vector<VORBaseUnknown*> list;
+    for (int i = 1; i <= cso->GetSize(); ++i)
+      list.push_back(cso->GetElement(i)->GetLeaf());
+    return list;
+  };
+  auto start = [] {
+    auto* command = new CollectStations();
+    VORCommandEngine::Start(command);
+    command->Release();
+  };
+  // Left selected by an earlier command, refused by this one: the first pick replaces it.
+  cso->AddElement(loading.get());
+  cso->AddElement(thing.get());
+  start();
+  EXPECT_EQ(cso->GetSize(), 2) << "starting changes nothing";
+  Pick(s1);
+  EXPECT_EQ(leaves(), (std::vector<VORBaseUnknown*>{s1.get()}));
+  Pick(s2);
+  EXPECT_EQ(leaves(), (std::vector<VORBaseUnknown*>{s1.get(), s2.get()}));
+  VORCommandEngine::CancelCurrent();
+
+  // Taken when the command starts: the picks join it.
+  cso->Empty();
+  cso->AddElement(s1.get());
+  start();
+  Pick(s2);
+  EXPECT_EQ(leaves(), (std::vector<VORBaseUnknown*>{s1.get(), s2.get()}));
+  VORCommandEngine::CancelCurrent();
+
+  // A refused pick keeps the old selection until a pick is taken.
+  cso->Empty();
+  cso->AddElement(loading.get());
+  start();
+  Pick(thing);
+  EXPECT_EQ(leaves(), (std::vector<VORBaseUnknown*>{loading.get()}));
+  Pick(s2);
+  EXPECT_EQ(leaves(), (std::vector<VORBaseUnknown*>{s2.get()}));
+}

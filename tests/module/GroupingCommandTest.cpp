@@ -424,3 +424,28 @@ TEST_F(GroupingCommandTest, AScriptGroupsPrintsTheDialogAndUndoesAndRedoesTheSte
   EXPECT_FALSE(script.Run("redo\n"));
   EXPECT_TRUE(out.str().find("nothing to redo") != std::string::npos) << out.str();
 }
+
+TEST_F(GroupingCommandTest, PicksAfterOpeningTheViewerStartANewSelectionWithoutTheLevel) {
+  MakeChain();
+  Open();
+  std::ostringstream out;
+  VORScript script(driver, out);
+  ASSERT_TRUE(
+      script.Run("pick Line\n"
+                 "start QELFpaProductFlowViewerCmd\n"
+                 "print cso\n"
+                 "start QELFpaPertGrpActCmd\n"
+                 "pick A\n"
+                 "pick B\n"
+                 "print cso\n"
+                 "print dialog QELFpaActivityGroupDlg\n"
+                 "ok QELFpaActivityGroupDlg\n"))
+      << out.str();
+  const std::string text = out.str();
+  auto has = [&](const std::string& part) { return text.find(part) != std::string::npos; };
+  EXPECT_TRUE(has("> print cso\ncso: Line\n")) << "the viewer leaves its level selected";
+  EXPECT_FALSE(has("notification")) << text;
+  EXPECT_TRUE(has("> pick B\n> print cso\ncso: A, B\n")) << text;
+  EXPECT_TRUE(has("title=\"Group Activities\" [OK sensitive]")) << text;
+  EXPECT_EQ(Children(root), "P N GroupActivity");
+}

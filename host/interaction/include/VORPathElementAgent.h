@@ -1,7 +1,8 @@
 // Agent that takes picked objects of one element type (an interface): single pick, or repeated
 // picks collected into one selection. Accepted picks update the current CSO and highlight (HSO);
 // the highlight is emptied when the command ends. As a CSO client the agent takes what is
-// already selected when its command starts.
+// already selected when its command starts; when it can take none of it (say, the level a
+// viewer was opened on), its first pick starts a new selection instead of joining that one.
 #pragma once
 
 #include "VORDialogAgent.h"
@@ -64,6 +65,8 @@ class VORPathElementAgent : public VORDialogAgent {
   VORAgentFilter _filter;
   void* _filterData = nullptr;
   VORListValVORBaseUnknown_var _selectedPaths;
+  // The CSO held only what this agent refused when its command started.
+  bool _selectionRefused = false;
 };
 
 VOR_DECLARE_HANDLE(VORPathElementAgent);

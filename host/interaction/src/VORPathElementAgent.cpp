@@ -67,7 +67,7 @@ bool VORPathElementAgent::Try(VORPathElement* path, bool updateCSO) {
                                  static_cast<VORSelectionSet*>(VORSelectionContext::HSO())}) {
       if (set == nullptr)
         continue;
-      if (!IsRepeated()) {
+      if (!IsRepeated() || _selectionRefused) {
         if (!(set->GetSize() == 1 && set->IsPresent(path))) {
           set->Empty();
           set->AddElement(path);
@@ -78,6 +78,7 @@ bool VORPathElementAgent::Try(VORPathElement* path, bool updateCSO) {
         set->AddElement(path);
       }
     }
+    _selectionRefused = false;
   }
   return true;
 }
@@ -90,6 +91,7 @@ bool VORPathElementAgent::OfferPath(VORPathElement* path) {
 }
 
 bool VORPathElementAgent::TakeCurrentSelection() {
+  _selectionRefused = false;
   VORCSO* cso = GetCSO();
   if (cso == nullptr || cso->IsEmpty())
     return false;
@@ -103,6 +105,7 @@ bool VORPathElementAgent::TakeCurrentSelection() {
   }
   if (taken)
     SetOutput(nullptr, nullptr);
+  _selectionRefused = !taken;
   return taken;
 }
 
