@@ -2,7 +2,8 @@
 #include "VORModelChecker.h"
 
 #include <algorithm>
-#include <unordered_map>
+#include <functional>
+#include <string_view>
 #include <unordered_set>
 
 #include "VORModelObjects.h"
@@ -17,7 +18,9 @@ class Checker {
     const size_t before = _problems.size();
     if (!_d.root)
       Problem("the document has no root process");
-    for (VORModelObject* o : _d.AllObjects()) {
+    const std::vector<VORModelObject*> all = _d.AllObjects();
+    _objects.reserve(all.size());
+    for (VORModelObject* o : all) {
       if (!_objects.insert(o).second)
         Problem("object '" + o->id + "' is reachable twice");
     }
@@ -38,8 +41,28 @@ class Checker {
  private:
   void Problem(std::string text) { _problems.push_back(std::move(text)); }
 
+  // Every object named, in the index under its own name, and nothing else in the index: when
+  // each entry of the index names a distinct object of the document by that object's id and
+  // there are as many entries as objects, ids are unique and complete without a lookup per id.
+  bool IdsHold() const {
+    if (_d.ids.size() != _objects.size())
+      return false;
+    for (const VORModelObject* o : _objects) {
+      if (o->id.empty() || o->data != &_d)
+        return false;
+    }
+    for (const auto& [id, o] : _d.ids) {
+      if (o == nullptr || o->id != id || _objects.count(o) == 0)
+        return false;
+    }
+    return true;
+  }
+
   void CheckIds() {
-    std::unordered_set<std::string> seen;
+    if (IdsHold())
+      return;
+    // Something is wrong: name every problem.
+    std::unordered_set<std::string_view> seen;  // views of the objects' own ids
     for (VORModelObject* o : _objects) {
       if (o->id.empty())
         Problem("an object of type '" + o->lateType + "' has no id");
@@ -59,22 +82,30 @@ class Checker {
     if (n->father != father)
       Problem("'" + n->id + "' has a wrong father");
     auto checkSide = [&](const std::vector<VORFlowRef>& refs, bool forward) {
+      // Most nodes have a few flows: a scan finds a repeated one without allocating.
+      constexpr size_t kScanned = 16;
       std::unordered_set<VORGraphNodeImpl*> seen;
-      for (const VORFlowRef& r : refs) {
-        const std::string what = "flow between '" + n->id + "' and '" +
-                                 (r.node ? r.node->id : std::string("null")) + "'";
+      for (size_t i = 0; i < refs.size(); ++i) {
+        const VORFlowRef& r = refs[i];
+        // The message is built only for a problem: a large document has millions of refs.
+        auto what = [&] {
+          return "flow between '" + n->id + "' and '" +
+                 (r.node ? r.node->id : std::string("null")) + "'";
+        };
         if (r.node == nullptr || _objects.count(r.node) == 0) {
-          Problem("dangling " + what);
+          Problem("dangling " + what());
           continue;
         }
         if (r.node->father != n->father || r.node == n)
-          Problem(what + " does not join two siblings");
-        if (!seen.insert(r.node).second)
-          Problem(what + " is given twice");
+          Problem(what() + " does not join two siblings");
+        const bool repeated =
+            refs.size() <= kScanned ? GivenBefore(refs, i) : !seen.insert(r.node).second;
+        if (repeated)
+          Problem(what() + " is given twice");
         const auto& other = forward ? r.node->previous : r.node->next;
         if (std::none_of(other.begin(), other.end(),
                          [&](const VORFlowRef& x) { return x.node == n && x.stamp == r.stamp; }))
-          Problem(what + " is known at one end only");
+          Problem(what() + " is known at one end only");
       }
     };
     checkSide(n->next, true);
@@ -122,30 +153,37 @@ class Checker {
   }
 
   void CheckLinks(VORModelObject* o) {
-    std::unordered_map<VORModelObject*, int> outCount;
+    _targets.clear();
     for (const VORModelLink& l : o->out) {
       if (l.target == nullptr || _objects.count(l.target) == 0) {
         Problem("dangling " + l.type + " link from '" + o->id + "'");
         continue;
       }
-      outCount[l.target]++;
-      const std::string what = l.type + " link '" + o->id + "' -> '" + l.target->id + "'";
+      _targets.push_back(l.target);
+      auto what = [&] { return l.type + " link '" + o->id + "' -> '" + l.target->id + "'"; };
       if (l.type == VORILinkableObject::ResourceLink) {
         auto* r = VORKindCast<VORProductImpl>(l.target);
         if (VORKindCast<VORActivityImpl>(o) == nullptr || r == nullptr || !r->isResource)
-          Problem(what + " does not assign a resource to an activity");
+          Problem(what() + " does not assign a resource to an activity");
       } else if (l.type == VORILinkableObject::ItemLink) {
         if (VORKindCast<VORActivityImpl>(o) == nullptr || !l.target->Is(VORKindItem))
-          Problem(what + " does not assign an item to an activity");
+          Problem(what() + " does not assign an item to an activity");
         if (l.via != nullptr &&
             (_objects.count(l.via) == 0 || l.via->activity != VORKindCast<VORActivityImpl>(o)))
-          Problem(what + " was made with an input that is not the activity's");
+          Problem(what() + " was made with an input that is not the activity's");
       }
     }
-    for (auto& [target, count] : outCount) {
-      const long back = std::count(target->in.begin(), target->in.end(), o);
-      if (back != count)
+    // Each target as often as o points at it: equal targets side by side.
+    std::sort(_targets.begin(), _targets.end(), std::less<>());
+    for (size_t i = 0; i < _targets.size();) {
+      VORModelObject* target = _targets[i];
+      size_t end = i;
+      while (end < _targets.size() && _targets[end] == target)
+        ++end;
+      const auto count = static_cast<long>(end - i);
+      if (std::count(target->in.begin(), target->in.end(), o) != count)
         Problem("links from '" + o->id + "' to '" + target->id + "' are known at one end only");
+      i = end;
     }
     for (VORModelObject* s : o->in) {
       if (s == nullptr || _objects.count(s) == 0)
@@ -174,9 +212,16 @@ class Checker {
     }
   }
 
+  // True when refs[i] names a node that an earlier ref names too.
+  static bool GivenBefore(const std::vector<VORFlowRef>& refs, size_t i) {
+    return std::any_of(refs.begin(), refs.begin() + static_cast<long>(i),
+                       [&](const VORFlowRef& r) { return r.node == refs[i].node; });
+  }
+
   VORDocumentData& _d;
   std::vector<std::string>& _problems;
   std::unordered_set<VORModelObject*> _objects;
+  std::vector<VORModelObject*> _targets;  // of the object CheckLinks looks at
 };
 
 }  // namespace
