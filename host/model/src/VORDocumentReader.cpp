@@ -129,18 +129,16 @@ class Loader {
     return v;
   }
 
-  std::string NewId(Node e) {
+  // Registers o under the element's id, which must be new: one lookup for the test and the
+  // insertion.
+  void Register(Node e, VORModelObject* o) {
     std::string id = Required(e, "id");
     if (id.empty())
       Fail(e, "<" + Tag(e) + "> with an empty id");
-    if (_data.Find(id) != nullptr)
+    if (!_data.ids.try_emplace(id, o).second)
       Fail(e, "duplicate id '" + id + "'");
-    return id;
-  }
-  void Register(VORModelObject* o, const std::string& id) {
-    o->id = id;
+    o->id = std::move(id);
     o->data = &_data;
-    _data.ids[id] = o;
   }
   template <class T>
   T* Ref(Node e, const char* attribute, const char* what) {
@@ -196,7 +194,7 @@ class Loader {
         continue;
       ExpectOnly(e, {"attribute", "relation"});
       auto t = VORHandle<VORPlanTypeImpl>::Adopt(new VORPlanTypeImpl());
-      Register(t.get(), NewId(e));
+      Register(e, t.get());
       for (Node a = _t.FirstChild(e); a != kNone; a = _t.Next(a)) {
         if (Tag(a) == "attribute")
           t->attributes[{Attr(a, "key"), Required(a, "name")}] = VORUnicodeString(Attr(a, "value"));
@@ -254,7 +252,7 @@ class Loader {
     std::vector<std::pair<Node, VORProductImpl*>> all;
     for (Node e = _t.FirstChild(products); e != kNone; e = _t.Next(e)) {
       auto p = VORHandle<VORProductImpl>::Adopt(new VORProductImpl());
-      Register(p.get(), NewId(e));
+      Register(e, p.get());
       p->partNumber = Text(e, "name");
       p->alias = VORUnicodeString(Attr(e, "alias"));
       p->shown = Long(e, "shown", 1, p->id) != 0;
@@ -312,7 +310,7 @@ class Loader {
     for (Node e = _t.FirstChild(assemblies); e != kNone; e = _t.Next(e)) {
       ExpectOnly(e, {"component"});
       auto m = VORHandle<VORMfgAssemblyImpl>::Adopt(new VORMfgAssemblyImpl());
-      Register(m.get(), NewId(e));
+      Register(e, m.get());
       m->name = VORUnicodeString(Attr(e, "name"));
       _data.assemblies.push_back(m);
       all.push_back({e, m.get()});
@@ -355,7 +353,7 @@ class Loader {
       Fail(e, "the root activity must be of type 'BIWActivityRoot', not '" + Attr(e, "type") + "'");
     auto root = VORHandle<VORRootImpl>::Adopt(new VORRootImpl(VORModelLateTypes::Root));
     _data.root = root;
-    Register(root.get(), NewId(e));
+    Register(e, root.get());
     LoadNodeBody(e, root.get());
   }
 
@@ -421,13 +419,13 @@ class Loader {
     for (Node c = _t.FirstChild(e); c != kNone; c = _t.Next(c)) {
       if (IsTag(c, "activity") || IsTag(c, "node")) {
         auto child = VORHandle<VORGraphNodeImpl>::Adopt(MakeNode(c));
-        Register(child.get(), NewId(c));
+        Register(c, child.get());
         child->father = a;
         a->children.push_back(child);
         LoadNodeBody(c, child.get());
       } else if (IsTag(c, "input") || IsTag(c, "output")) {
         auto io = VORHandle<VORProductIOImpl>::Adopt(new VORProductIOImpl(IsTag(c, "input")));
-        Register(io.get(), NewId(c));
+        Register(c, io.get());
         io->activity = a;
         Link(io.get(), ItemRef(c, "item"), VORILinkableObject::IOItemLink);
         a->productIOs.push_back(io);

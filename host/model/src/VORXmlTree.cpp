@@ -10,6 +10,7 @@
 #include <xercesc/util/SecurityManager.hpp>
 #include <xercesc/util/XMLUni.hpp>
 
+#include <algorithm>
 #include <memory>
 
 #include "VORXercesSupport.h"
@@ -135,8 +136,10 @@ bool VORXmlTree::Parse(const std::string& content, const std::string& name, std:
   }
   if (!VORXercesPlatform::CheckRawText(content, name, error, limits))
     return false;
-  _elements.reserve(content.size() / 80);
-  _attributes.reserve(content.size() / 30);
+  // Every element starts with '<' and every attribute has its '=': counting them (a fast scan)
+  // bounds both tables, so that neither is copied while it grows.
+  _elements.reserve(static_cast<size_t>(std::count(content.begin(), content.end(), '<')));
+  _attributes.reserve(static_cast<size_t>(std::count(content.begin(), content.end(), '=')));
 
   VORBudgetMemoryManager memory(limits.maxMemoryBytes);
   SecurityManager security;
