@@ -280,6 +280,7 @@ class Loader {
     }
     // The tree must be a tree: following fathers ends at a root.
     std::unordered_map<VORProductImpl*, int> state;  // 1 on the current path, 2 done
+    state.reserve(all.size());
     for (auto& [e, p] : all) {
       std::vector<VORProductImpl*> path;
       VORProductImpl* q = p;
@@ -519,7 +520,8 @@ VORProcess* VORProcess::LoadFromString(const std::string& xml, const std::string
     if (!tree.Parse(xml, name, error, limits))
       return nullptr;
     Report(60);
-    doc->_data->ids.reserve(tree.Size() / 2);
+    // At most one id per element: the index never rehashes while the loader fills it.
+    doc->_data->ids.reserve(tree.Size());
     try {
       Loader loader(tree, name, *doc->_data);
       loader.Load();
