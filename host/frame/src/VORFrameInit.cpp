@@ -7,8 +7,8 @@
 
 void VORInitFrame() {
   static const bool initialised = [] {
+    VORInitVisu();  // before the dialogs: kernel, model, interaction, visu, dialog, frame
     VORInitDialog();
-    VORInitVisu();
     QELRegisterFPAAdapters();
     VORFrmHostCommands::DeclareAll();
     return true;
