@@ -1,5 +1,8 @@
 // Registers the ZitBlt model's extensions when the module is loaded.
 #include "QELEListZitBltItem.h"
+#include "QELEListZitBltItemDDPI.h"
+#include "QELEListZitBltItemDDPO.h"
+#include "QELEListZitBltItemDDResource.h"
 #include "QELEListZitBltItemStatePI.h"
 #include "QELEZitBltCBSubscriber.h"
 #include "QELEZitBltMgr.h"
@@ -28,6 +31,16 @@ extern "C" void VORInitModule() {
   VORExtensionRegistry::Register(
       "ProductInput", QELIListZitBltItemState::IID(),
       []() -> VORExtension* { return new QELEListZitBltItemStatePI(); }, VORExtensionKind::Data);
+  // Dragging list items onto other activities.
+  VORExtensionRegistry::Register(
+      "ProductInput", QELIListZitBltItemDD::IID(),
+      []() -> VORExtension* { return new QELEListZitBltItemDDPI(); }, VORExtensionKind::Code);
+  VORExtensionRegistry::Register(
+      "ProductOutput", QELIListZitBltItemDD::IID(),
+      []() -> VORExtension* { return new QELEListZitBltItemDDPO(); }, VORExtensionKind::Data);
+  VORExtensionRegistry::Register(
+      "ASMPRODUCT", QELIListZitBltItemDD::IID(),
+      []() -> VORExtension* { return new QELEListZitBltItemDDResource(); }, VORExtensionKind::Code);
   QELRegisterZitBltScriptStep();
   QELRegisterScrollListScriptSteps();  // the list visualisation this module links
 }

@@ -22,6 +22,14 @@ class VORDlgSelectorList : public VORDlgControl {
   const std::vector<int>& GetSelect() const { return _selected; }
   void SetSelect(const std::vector<int>& rows);
   static const char* GetListSelectNotification() { return "VORDlgListSelectNotification"; }
+  // How much of the list a view shows: characters per line and lines (0: the view's choice).
+  void SetVisibleSize(int columns, int lines) {
+    _visibleColumns = columns;
+    _visibleLines = lines;
+    Changed();
+  }
+  int GetVisibleColumns() const { return _visibleColumns; }
+  int GetVisibleLines() const { return _visibleLines; }
 
   // The user selects rows (out-of-range rows are dropped). False when insensitive.
   bool UserSelect(const std::vector<int>& rows);
@@ -29,4 +37,6 @@ class VORDlgSelectorList : public VORDlgControl {
  private:
   VORListValVORUnicodeString _lines;
   std::vector<int> _selected;
+  int _visibleColumns = 0;
+  int _visibleLines = 0;
 };
