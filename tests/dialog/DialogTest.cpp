@@ -160,6 +160,19 @@ TEST(DialogTest, SelectorListKeepsValidRowsInOrder) {
   EXPECT_EQ(list->GetValueText(), VORUnicodeString("a, c"));
 }
 
+TEST(DialogTest, ASingleSelectionListKeepsOneRowAndTellsItsVisibleSize) {
+  auto list = VORHandle<VORDlgSelectorList>::Adopt(
+      new VORDlgSelectorList(nullptr, "L", VORDlgLstSingleSelection));
+  for (const char* line : {"A", "B", "C"})
+    list->SetLine(line);
+  EXPECT_TRUE(list->UserSelect({2, 1}));
+  EXPECT_EQ(list->GetSelect(), std::vector<int>{1}) << "the first in row order";
+  EXPECT_EQ(list->GetVisibleColumns(), 0) << "the view chooses until told";
+  list->SetVisibleSize(15, 7);
+  EXPECT_EQ(list->GetVisibleColumns(), 15);
+  EXPECT_EQ(list->GetVisibleLines(), 7);
+}
+
 TEST(NotifyTest, TheRecorderKeepsTitleTextAndStyleAndAnswersOKUntilAnotherPresenterIsSet) {
   VORDlgNotify::Recorder().Clear();
   auto notify = VORHandle<VORDlgNotify>::Adopt(new VORDlgNotify(nullptr, "NoZitBlt", 0x10000200));

@@ -154,7 +154,7 @@ TEST_F(ZitBltListScriptTest, SlidingTheButtonDownTheLeftEdgeTurnsTheListDownward
             std::string::npos);
 }
 
-TEST_F(ZitBltListScriptTest, ASelectedItemDraggedOverAnotherActivityFindsItAndComesBack) {
+TEST_F(ZitBltListScriptTest, ASelectedItemDraggedOverAnotherActivityIsDroppedThereOrComesBack) {
   Run("expand S ProductInput\npick-item S ProductInput P2\n");
   QELBaseScrollListZitBltRep* list = List();
   ASSERT_EQ(list->GetItemManipulator()->GetElementCount(), 1);
@@ -179,12 +179,21 @@ TEST_F(ZitBltListScriptTest, ASelectedItemDraggedOverAnotherActivityFindsItAndCo
   ASSERT_TRUE(driver.Drag("", box.CentreX(), box.CentreY(), tx, ty)) << driver.LastError();
   ASSERT_FALSE(targets.empty());
   EXPECT_EQ(targets.back(), driver.FindObject("T")) << "the activity under the pointer";
-  EXPECT_EQ(cursors.back(), 5) << "no drop allowed: items offer no drop yet";
+  EXPECT_EQ(cursors.back(), 8) << "T takes the input";
   EXPECT_EQ(list->GetViewer()->GetCursor(), 25) << "after the drag";
   EXPECT_EQ(list->GetDropTarget(), nullptr);
   EXPECT_EQ(driver.GetEditor()->GetCSO()->GetSize(), 0) << "the selection is emptied";
+  EXPECT_EQ(driver.TakeEvents(), std::vector<std::string>{"drop on \"T\": allowed"});
+  EXPECT_EQ(Run("print list S ProductInput\n").find("\"P2\""), std::string::npos)
+      << "the input went to T";
+
+  // Released over no activity, an item goes back to its place.
+  Run("pick-item S ProductInput P3\n");
+  ASSERT_TRUE(driver.Drag("", box.CentreX(), box.CentreY(), box.CentreX(), box.CentreY() - 40.0))
+      << driver.LastError();
+  EXPECT_TRUE(driver.TakeEvents().empty());
   EXPECT_NE(Run("print list S ProductInput\n")
-                .find("item 2 \"P2\": kind 1, state 0, shown, "
+                .find("item 2 \"P3\": kind 1, state 0, shown, "
                       "label (-17, 3)"),
             std::string::npos)
       << "back in its place";

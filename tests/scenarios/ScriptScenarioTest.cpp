@@ -41,3 +41,24 @@ TEST(ScriptScenarioTest, ThePickCopyStoryAsAScriptPrintsWhatAPlannerChecks) {
       << output;
   EXPECT_NE(status, 0);
 }
+
+TEST(ScriptScenarioTest, DraggingListLinesOfTheSampleLineMovesWhatIsAllowedAndUndoesIt) {
+  TempDir dir;
+  const char* examples = std::getenv("PFV_EXAMPLES");
+  ASSERT_NE(examples, nullptr) << "ctest gives the examples folder";
+  ::setenv("SCENARIO_OUT", dir.Path().c_str(), 1);
+  int status = 0;
+  std::string output =
+      RunProgram(std::string(PFV_BINARY) + " script " SCENARIO_DATA "/drag_item.pfvs 2>&1", status);
+  ReplaceAll(output, examples, "${PFV_EXAMPLES}");
+  ReplaceAll(output, dir.Path(), "${SCENARIO_OUT}");
+  std::string expected, error;
+  ASSERT_TRUE(VORReadFile(SCENARIO_DATA "/drag_item.expected", expected, error)) << error;
+  EXPECT_EQ(output, expected);
+  EXPECT_EQ(status, 0);
+  // The undone document is the one the planner started from, byte for byte.
+  std::string before, undone;
+  ASSERT_TRUE(VORReadFile(dir.Path() + "/before.pprx", before, error)) << error;
+  ASSERT_TRUE(VORReadFile(dir.Path() + "/undone.pprx", undone, error)) << error;
+  EXPECT_EQ(undone, before);
+}

@@ -42,7 +42,7 @@ void QELFpaBIWDDOptionsDlg::Build() {
   auto* frame = new VORDlgFrame(this, kFrame, kFrameStyle);
   frame->SetTitle(VORUnicodeString(kFrame));
   frame->SetGridConstraints(1, 0, 1, 1, VORDlgAttach4Sides);
-  _list = new VORDlgSelectorList(frame, kListName);
+  _list = new VORDlgSelectorList(frame, kListName, VORDlgLstSingleSelection);
   _list->SetGridConstraints(0, 0, 1, 1, VORDlgAttach4Sides);
   _list->SetVisibleSize(kListColumns, kListLines);
 }

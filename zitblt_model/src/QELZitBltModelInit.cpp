@@ -6,6 +6,7 @@
 #include "QELEListZitBltItemStatePI.h"
 #include "QELEZitBltCBSubscriber.h"
 #include "QELEZitBltMgr.h"
+#include "QELPFViewerItemSelectShowComponent.h"
 #include "QELScrollListScriptSteps.h"
 #include "QELZitBltScriptStep.h"
 #include "VORExtensionRegistry.h"
@@ -41,6 +42,8 @@ extern "C" void VORInitModule() {
   VORExtensionRegistry::Register(
       "ASMPRODUCT", QELIListZitBltItemDD::IID(),
       []() -> VORExtension* { return new QELEListZitBltItemDDResource(); }, VORExtensionKind::Code);
+  // What a picked list line selects and hides (the list visualisation this module links).
+  QELPFViewerItemSelectShowComponent::Register();
   QELRegisterZitBltScriptStep();
   QELRegisterScrollListScriptSteps();  // the list visualisation this module links
 }

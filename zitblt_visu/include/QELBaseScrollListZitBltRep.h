@@ -94,7 +94,7 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   void FinalizePertNodePosition();
 
   // Asks the activity to recompute its welding and curve-fastening cycle times.
-  void UpdateCycleTime(VORBaseUnknown* activity);
+  static void UpdateCycleTime(VORBaseUnknown* activity);
 
   // State, for the list commands, scripts and tests.
   VORBaseUnknown* GetOwner() const { return _owner; }
@@ -108,6 +108,9 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   bool HasValidTarget() const { return _validTarget != 0; }
   // The activity under the items being dragged (null between drags).
   VORBaseUnknown* GetDropTarget() const { return _dropTarget.get(); }
+  // Why the activity under the dragged items refuses them (empty when it accepts them or
+  // there is none); also shown in a balloon beside the pointer.
+  const VORUnicodeString& GetDropRefusal() const { return _dropRefusal; }
   int GetItemVisualCount() const { return static_cast<int>(_itemVisuals.size()); }
   // 1-based; null out of range.
   QELIScrollListZitBltItemVisu* GetItemVisual(int position) const;
@@ -135,6 +138,13 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   void RestoreButtonColour();
   // Takes the items of this list out of the selection before their reps go.
   void DeselectItems();
+  // The list item and the component of each dragged item rep.
+  std::vector<QELIScrollListZitBltItemVisu_var> DraggedItems() const;
+  // The verdict on the activity under the pointer: cursor, balloon, valid target.
+  void JudgeDropTarget(const VORMathPoint2D& point);
+  // Carries out the drop on the current target, or announces its refusal; true when it was
+  // carried out.
+  bool Drop();
   // Appends item with its state unless it is null or listed; true when appended.
   bool AddItem(VORBaseUnknown* item, int state);
 
@@ -167,6 +177,8 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   VORCallbackId _contextCallback = 0;
   VORCallbackId _menuCallback = 0;
   VORBaseUnknown_var _dropTarget;  // the activity under the dragged items
+  VORUnicodeString _dropRefusal;
+  VORPVBalloon_var _dropBalloon;
 };
 VOR_DECLARE_HANDLE(QELBaseScrollListZitBltRep);
 

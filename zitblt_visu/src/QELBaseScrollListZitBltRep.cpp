@@ -11,6 +11,7 @@
 #include "QELIZitBltCBSubscriber.h"
 #include "QELIZitBltMgr.h"
 #include "QELPFViewerItemRepComponent.h"
+#include "QELScrollListDrop.h"
 #include "QELScrollListSelectionWatch.h"
 #include "VORCommandHeader.h"
 #include "VORDeferredDeletion.h"
@@ -610,6 +611,63 @@ void QELBaseScrollListZitBltRep::OnCSONotif(VORNotification* notif) {
     ValidateAddRemElem(dynamic_cast<VORPathElement*>(element.get()), 0);
 }
 
+std::vector<QELIScrollListZitBltItemVisu_var> QELBaseScrollListZitBltRep::DraggedItems() const {
+  std::vector<QELIScrollListZitBltItemVisu_var> dragged;
+  for (const VORHandle<VOR2DRep>& element : _itemManipulator->GetElements()) {
+    QELIScrollListZitBltItemVisu_var visual{VORBaseUnknown_var(element->GetObject())};
+    if (visual && visual->GetAssociatedPFItem() != nullptr)
+      dragged.push_back(visual);
+  }
+  return dragged;
+}
+
+void QELBaseScrollListZitBltRep::JudgeDropTarget(const VORMathPoint2D& point) {
+  _dropTarget = NULL_var;
+  _dropRefusal = VORUnicodeString();
+  const std::vector<QELIScrollListZitBltItemVisu_var> dragged = DraggedItems();
+  // The dragged lines are under the pointer themselves: look through them.
+  auto isDragged = [&dragged](VORBaseUnknown* element) {
+    for (const QELIScrollListZitBltItemVisu_var& visual : dragged) {
+      if (visual.Identity() == element->GetIdentity())
+        return true;
+    }
+    return false;
+  };
+  for (const VORPathElement_var& path : _viewer->PickPathsAtModelPoint(point.x, point.y)) {
+    if (path->SearchElement(isDragged))
+      continue;
+    if (VORISPPActivity_var activity = path->SearchElement<VORISPPActivity>(); activity) {
+      _dropTarget = VORBaseUnknown_var(activity);
+      break;
+    }
+  }
+  bool refused = false;
+  for (const QELIScrollListZitBltItemVisu_var& visual : dragged) {
+    VORBaseUnknown* source = visual->GetAssociatedActivityNode();
+    if (!_dropTarget || source == nullptr || source->GetIdentity() == _dropTarget.Identity())
+      continue;  // back over its own activity, or over no activity: nothing to say
+    VORUnicodeString message;
+    if (QELScrollListDrop::Check(visual->GetAssociatedPFItem(), source, _dropTarget, message)) {
+      _viewer->SetCursor(kCursorDropAllowed);
+      _validTarget = 1;
+    } else if (!refused) {
+      _dropRefusal = message;
+      refused = true;
+    }
+  }
+  if (_validTarget)
+    _dropRefusal = VORUnicodeString();
+  // A refusal is said beside the pointer, so that a drop there never looks like nothing.
+  if (!_dropRefusal.IsEmpty()) {
+    if (!_dropBalloon)
+      _dropBalloon = VORPVBalloon_var::Adopt(new VORPVBalloon(_viewer.get()));
+    _dropBalloon->SetVisibility(1);
+    _dropBalloon->Show(_dropRefusal, point);
+  } else if (_dropBalloon) {
+    _dropBalloon->Hide(1);
+  }
+}
+
 void QELBaseScrollListZitBltRep::OnVORManipulate() {
   _csoBusy = 1;
   _validTarget = 0;
@@ -617,16 +675,7 @@ void QELBaseScrollListZitBltRep::OnVORManipulate() {
     return;
   _viewer->SetCursor(kCursorDragging);
   const VORMathPoint2D point = _itemManipulator->GetCurrentPoint();
-  _dropTarget = NULL_var;
-  for (const VORPathElement_var& path : _viewer->PickPathsAtModelPoint(point.x, point.y)) {
-    if (VORISPPActivity_var activity = path->SearchElement<VORISPPActivity>(); activity) {
-      _dropTarget = VORBaseUnknown_var(activity);
-      break;
-    }
-  }
-  // The drop check of each item (product inputs, outputs and resources each have their own
-  // rules) is the item's drag-and-drop interface, which no list item offers yet: until then no
-  // target accepts a drop and the cursor keeps saying so.
+  JudgeDropTarget(point);
   const auto px = static_cast<float>(point.x);
   const auto py = static_cast<float>(point.y);
   if (_itemDragX == 0.0f && _itemDragY == 0.0f) {
@@ -660,23 +709,61 @@ void QELBaseScrollListZitBltRep::OnVOREndManipulate() {
   FinalizePertNodePosition();
 }
 
+bool QELBaseScrollListZitBltRep::Drop() {
+  struct Move {
+    VORBaseUnknown_var item;
+    VORBaseUnknown_var source;
+  };
+  std::vector<Move> moves;
+  const VORBaseUnknown_var target = _dropTarget;
+  for (const QELIScrollListZitBltItemVisu_var& visual : DraggedItems()) {
+    VORBaseUnknown* source = visual->GetAssociatedActivityNode();
+    if (source == nullptr || source->GetIdentity() == target.Identity())
+      continue;
+    VORUnicodeString message;
+    const bool allowed =
+        QELScrollListDrop::Check(visual->GetAssociatedPFItem(), source, target, message);
+    QELScrollListDrop::Announce(target, allowed, message);
+    if (allowed)
+      moves.push_back(
+          {VORBaseUnknown_var(visual->GetAssociatedPFItem()), VORBaseUnknown_var(source)});
+  }
+  if (moves.empty())
+    return false;
+  // The item reps are rebuilt by the refresh: nothing may ride on the manipulator any more.
+  _itemManipulator->RemoveAllElements();
+  {
+    const QELScrollListDrop::UndoStep step(target);
+    for (const Move& move : moves)
+      QELScrollListDrop::Reassign(move.item, move.source, target);
+  }
+  for (const Move& move : moves)
+    QELScrollListDrop::Refresh(move.source);
+  QELScrollListDrop::Refresh(target);
+  return true;
+}
+
 void QELBaseScrollListZitBltRep::FinalizePertNodePosition() {
   VORHandle<QELBaseScrollListZitBltRep> self(this);
   if (_viewer)
     _viewer->SetCursor(kCursorAfterDrag);
+  if (_dropBalloon)
+    _dropBalloon->Hide(1);
   SendNotification(GetFather(), _itemManipulator->GetVOREndManipulate());
-  // A drop is refreshed through the managers of both activities; without one, the dragged
-  // items go back to their places.
   const bool moved = _itemsMoved;
   _itemsMoved = false;
   _itemDragX = 0.0f;
   _itemDragY = 0.0f;
+  // A drop over another activity is carried out (the lists concerned are rebuilt) or its
+  // refusal said; anywhere else the dragged items simply go back to their places.
+  const bool dropped = _dropTarget && Drop();
   if (VORCSO* cso = CurrentCSO())
     cso->Empty(1);
   _validTarget = 0;
   _csoBusy = 0;
   _dropTarget = NULL_var;
-  if (moved)
+  _dropRefusal = VORUnicodeString();
+  if (moved && !dropped)
     ReFreshZitBltReps(GetLocation());
 }
 

@@ -1,6 +1,7 @@
 // Script steps that drive and print the ZitBlt lists of a chart without a screen: open and close
 // a ZitBlt, print a list, scroll it, open its button's context menu, show its balloon, click an
-// item, slide the ZitBlt round its node. Registered by the ZitBlt model module's initialisation.
+// item, drag it onto another activity, slide the ZitBlt round its node. Registered by the ZitBlt
+// model module's initialisation.
 #include <cstdio>
 #include <functional>
 #include <memory>
@@ -17,6 +18,7 @@
 #include "VORExtIVisu.h"
 #include "VORFrmLayout.h"
 #include "VORFrmWindowKinds.h"
+#include "VORIGraphNodeLayout.h"
 #include "VORScript.h"
 
 namespace {
@@ -278,11 +280,9 @@ bool Balloon(VORDriver& driver, const Words& words, std::ostream& out, std::stri
   return true;
 }
 
-bool PickItem(VORDriver& driver, const Words& words, std::string& error) {
-  Target t;
-  QELBaseScrollListZitBltRep* list = nullptr;
-  if (!FindList(driver, words, 4, "pick-item <node> <zitblt> <item label>", t, list, error))
-    return false;
+// The centre of the shown label of the item words[3] of an open list.
+bool ItemLabelCentre(QELBaseScrollListZitBltRep* list, const Words& words, VORMathPoint2D& at,
+                     std::string& error) {
   if (list->IsButtonCollapse()) {
     error = "list \"" + words[2] + "\" of \"" + words[1] + "\" is closed";
     return false;
@@ -296,11 +296,53 @@ bool PickItem(VORDriver& driver, const Words& words, std::string& error) {
       error = "item \"" + words[3] + "\" is scrolled out of view";
       return false;
     }
-    const VORMathPoint2D at = BoxCentreInModel(text);
-    return DriverStep(driver, driver.PickInChart(t.window, at.x, at.y), error);
+    at = BoxCentreInModel(text);
+    return true;
   }
   error = "list \"" + words[2] + "\" of \"" + words[1] + "\" has no item \"" + words[3] + "\"";
   return false;
+}
+
+bool PickItem(VORDriver& driver, const Words& words, std::string& error) {
+  Target t;
+  QELBaseScrollListZitBltRep* list = nullptr;
+  VORMathPoint2D at;
+  if (!FindList(driver, words, 4, "pick-item <node> <zitblt> <item label>", t, list, error) ||
+      !ItemLabelCentre(list, words, at, error))
+    return false;
+  return DriverStep(driver, driver.PickInChart(t.window, at.x, at.y), error);
+}
+
+// A click on the item, then a drag of it onto the centre of the target's node; the list says
+// its verdict on the drop (an event line) before carrying it out.
+bool DragItem(VORDriver& driver, const Words& words, std::string& error) {
+  Target t;
+  QELBaseScrollListZitBltRep* list = nullptr;
+  VORMathPoint2D at;
+  if (!FindList(driver, words, 5, "drag-item <node> <zitblt> <item label> <target node>", t, list,
+                error) ||
+      !ItemLabelCentre(list, words, at, error))
+    return false;
+  VORBaseUnknown* target = driver.FindObject(words[4]);
+  if (target == nullptr) {
+    error = "no object \"" + words[4] + "\"";
+    return false;
+  }
+  VORIGraphNodeLayout_var layout{VORBaseUnknown_var(target)};
+  if (!layout || !layout->HasPertPosition()) {
+    error = "\"" + words[4] + "\" is not placed in the chart";
+    return false;
+  }
+  if (!driver.PickInChart(t.window, at.x, at.y))
+    return DriverStep(driver, false, error);
+  if (list->GetItemManipulator()->GetElementCount() == 0) {
+    error = "item \"" + words[3] + "\" cannot be dragged";
+    return false;
+  }
+  double x = 0.0;
+  double y = 0.0;
+  layout->GetPertPosition(x, y);
+  return DriverStep(driver, driver.Drag(t.window, at.x, at.y, x, y), error);
 }
 
 bool Slide(VORDriver& driver, const Words& words, std::string& error) {
@@ -335,6 +377,8 @@ void QELRegisterScrollListScriptSteps() {
   VORScript::RegisterStep("balloon", Balloon);
   VORScript::RegisterStep("pick-item", [](VORDriver& d, const Words& w, std::ostream&,
                                           std::string& e) { return PickItem(d, w, e); });
+  VORScript::RegisterStep("drag-item", [](VORDriver& d, const Words& w, std::ostream&,
+                                          std::string& e) { return DragItem(d, w, e); });
   VORScript::RegisterStep("slide", [](VORDriver& d, const Words& w, std::ostream&, std::string& e) {
     return Slide(d, w, e);
   });

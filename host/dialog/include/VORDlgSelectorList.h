@@ -1,9 +1,11 @@
-// A list of lines of which the user selects one or several.
+// A list of lines of which the user selects one or several (one with the style
+// VORDlgLstSingleSelection).
 #pragma once
 
 #include <vector>
 
 #include "VORDlgControl.h"
+#include "VORDlgStyles.h"
 #include "VORLists.h"
 
 class VORDlgSelectorList : public VORDlgControl {

@@ -16,6 +16,9 @@ inline constexpr int VORDlgNfyInformation = 0x40000000;
 // Combos: read-only drop-down list.
 inline constexpr int VORDlgCmbDropDown = 0x40000;
 
+// Selector lists: one line selected at a time (otherwise several).
+inline constexpr int VORDlgLstSingleSelection = 0x1;
+
 // Check button states.
 inline constexpr int VORDlgCheck = 0x40000;
 inline constexpr int VORDlgUncheck = 0x80000;

@@ -44,6 +44,9 @@ void VORDlgSelectorList::SetSelect(const std::vector<int>& rows) {
   }
   std::sort(_selected.begin(), _selected.end());
   _selected.erase(std::unique(_selected.begin(), _selected.end()), _selected.end());
+  // A single-selection list keeps the first of the rows asked for.
+  if ((GetStyle() & VORDlgLstSingleSelection) != 0 && _selected.size() > 1)
+    _selected.resize(1);
   Changed();
 }
 

@@ -46,6 +46,9 @@ class VORDriver {
 
   // A pick in the tree: the object by id (or by label), with the objects above it.
   bool PickObject(const std::string& idOrLabel);
+  // Makes the current selection exactly these objects (by id or label, with the objects above
+  // them), in this order; nothing changes when one is unknown.
+  bool SelectObjects(const std::vector<std::string>& idsOrLabels);
   // A click in a window (by title or name, empty: the current window) at a model point: through
   // the window's viewer when it has one, else on the chart window's node boxes. A click on the
   // background empties the selection (without a command) and is reported as an event.
@@ -59,6 +62,7 @@ class VORDriver {
   bool PressCancel(const std::string& dialog = std::string());
   bool CloseDialog(const std::string& dialog = std::string());
   bool TypeText(const std::string& dialog, const std::string& editor, const std::string& text);
+  // Chooses a line of a combo, or of a selector list (the line becomes its only selection).
   bool ChooseComboLine(const std::string& dialog, const std::string& combo,
                        const std::string& line);
   bool ToggleCheckButton(const std::string& dialog, const std::string& button);
@@ -78,7 +82,8 @@ class VORDriver {
   bool CloseWindow(const std::string& titleOrName);
 
   // What happened since the last call, one line each: "notification \"title\": text",
-  // "command <id> ended" / "cancelled", "command <id> started".
+  // "command <id> ended" / "cancelled", "command <id> started", and the texts of
+  // VORFrmMessageNotification.
   std::vector<std::string> TakeEvents();
   const std::vector<VORDlgNotifyRecord>& Notifications() const;
   int DrainDeferred();
@@ -102,5 +107,6 @@ class VORDriver {
   size_t _notificationsSeen = 0;
   unsigned int _engineCallback = 0;
   unsigned int _pickCallback = 0;
+  unsigned int _messageCallback = 0;
   VORHandle<VORDlgControl> _menu;
 };

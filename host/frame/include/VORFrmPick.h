@@ -1,8 +1,8 @@
 // Where a user's pick goes, whether it comes from a viewer click or from the driver: the running
 // command's agents first (front path first); without a command waiting for picks, the editor's
 // CSO (Shift or Control with multi-selection behaviour 1 toggles the path in it; a click on the
-// background empties it). Each pick is announced on the application frame's publisher with a
-// VORFrmPickNotification.
+// background empties it; a component that answers VORISelectShow names what is selected). Each pick
+// is announced on the application frame's publisher with a VORFrmPickNotification.
 #pragma once
 
 #include <vector>

@@ -9,6 +9,8 @@
 #include "VORDlgCombo.h"
 #include "VORDlgContextualMenu.h"
 #include "VORDlgEditor.h"
+#include "VORDlgSelectorList.h"
+#include "VORFrmMessageNotification.h"
 #include "VORFrmPick.h"
 #include "VORFrmWindowKinds.h"
 #include "VORIGENode.h"
@@ -80,6 +82,11 @@ VORDriver::VORDriver() {
         else if (pick->GetResult() == VORFrmPickNotification::Background)
           _events.push_back("click on the background");
       });
+  _messageCallback = Frame()->GetEventPublisher()->AddCallback(
+      VORFrmMessageNotification::ClassName(),
+      [this](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
+        _events.push_back(static_cast<VORFrmMessageNotification*>(n)->GetText());
+      });
   _engineCallback = VORCommandEngine::GetEventPublisher()->AddCallback(
       "VORCommandEndNotification",
       [this](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
@@ -96,6 +103,7 @@ VORDriver::~VORDriver() {
   Frame()->CloseAll();
   VORCommandEngine::GetEventPublisher()->RemoveCallback(_engineCallback);
   Frame()->GetEventPublisher()->RemoveCallback(_pickCallback);
+  Frame()->GetEventPublisher()->RemoveCallback(_messageCallback);
   VORDeferredDeletion::Drain();
 }
 
@@ -261,6 +269,22 @@ bool VORDriver::PickObject(const std::string& idOrLabel) {
   return OfferPick(path);
 }
 
+bool VORDriver::SelectObjects(const std::vector<std::string>& idsOrLabels) {
+  VORFrmEditor* editor = GetEditor();
+  if (editor == nullptr)
+    return Fail("no document is open");
+  VORListValVORBaseUnknown_var paths;
+  for (const std::string& name : idsOrLabels) {
+    VORPathElement_var path = PathOf(name);
+    if (!path)
+      return Fail("no object \"" + name + "\"");
+    paths.Append(VORBaseUnknown_var(path.get()));
+  }
+  editor->GetCSO()->Empty();
+  editor->GetCSO()->AddElements(paths);
+  return Step(true);
+}
+
 bool VORDriver::PickInChart(const std::string& window, double x, double y) {
   VORFrmWindow* w = FindWindow(window);
   if (w == nullptr)
@@ -338,7 +362,15 @@ bool VORDriver::TypeText(const std::string& dialog, const std::string& editor,
 bool VORDriver::ChooseComboLine(const std::string& dialog, const std::string& combo,
                                 const std::string& line) {
   _error.clear();
-  auto* c = dynamic_cast<VORDlgCombo*>(FindControl(dialog, combo));
+  VORDlgControl* control = FindControl(dialog, combo);
+  if (auto* list = dynamic_cast<VORDlgSelectorList*>(control)) {
+    for (int i = 0; i < list->GetLineCount(); ++i) {
+      if (list->GetLine(i) == VORUnicodeString(line))
+        return list->UserSelect({i}) ? Step(true) : Fail("\"" + combo + "\" is insensitive");
+    }
+    return Fail("\"" + combo + "\" has no line \"" + line + "\"");
+  }
+  auto* c = dynamic_cast<VORDlgCombo*>(control);
   if (c == nullptr)
     return _error.empty() ? Fail("\"" + combo + "\" is not a combo") : false;
   if (!c->UserSelect(VORUnicodeString(line)))

@@ -2,6 +2,7 @@
 
 #include "VORApplicationFrame.h"
 #include "VORCommandEngine.h"
+#include "VORExtISelectShow.h"
 #include "VORStateCommand.h"
 #include "VORViewer.h"
 
@@ -31,7 +32,8 @@ VORFrmPickNotification::Result VORFrmDispatchPick(VORFrmEditor* editor,
     cso->Empty();
     return Announce(nullptr, VORFrmPickNotification::Background);
   }
-  VORPathElement* front = paths.front();
+  // A picked component may stand for another element (a list line for its item).
+  const VORPathElement_var front = VORSelectShow::PathToSelect(paths.front());
   const bool toggle = multiSelBehavior == 1 && (modifiers & (VORModShift | VORModControl)) != 0;
   if (toggle) {
     if (!cso->RemoveElement(front))

@@ -8,6 +8,7 @@
 
 #include "VORApplicationFrame.h"
 #include "VORCommandHeader.h"
+#include "VORExtISelectShow.h"
 #include "VORFrmPropertiesDlg.h"
 #include "VORIGENode.h"
 #include "VORIGraphNodeLayout.h"
@@ -184,6 +185,19 @@ VORBaseUnknown_var Target(VORBaseUnknown* argument) {
   return VORBaseUnknown_var();
 }
 
+// What hide/show acts on: the argument, else what the first selected path's components give
+// for it (VORISelectShow), else its leaf.
+VORBaseUnknown_var HideShowTarget(VORBaseUnknown* argument) {
+  if (argument != nullptr)
+    return VORBaseUnknown_var(argument);
+  for (VORSelectionSet* set : {static_cast<VORSelectionSet*>(VORSelectionContext::PSO()),
+                               static_cast<VORSelectionSet*>(VORSelectionContext::CSO())}) {
+    if (set != nullptr && !set->IsEmpty())
+      return VORSelectShow::ElementForHideShow(set->GetElement(1));
+  }
+  return VORBaseUnknown_var();
+}
+
 // The current window when it is a product space of the current editor, else the last one.
 VORNewInventorySpaceWnd* CurrentProductSpace() {
   VORFrmLayout* layout = VORFrmLayout::GetCurrentLayout();
@@ -220,7 +234,7 @@ void DeclareAll() {
   });
   Host(HideShow, [](VORBaseUnknown* argument) {
     if (VORNewInventorySpaceWnd* space = CurrentProductSpace())
-      space->HideShow(Target(argument));
+      space->HideShow(HideShowTarget(argument));
   });
   Host(PertChart, [](VORBaseUnknown* argument) {
     VORBaseUnknown_var root = Target(argument);

@@ -1,11 +1,13 @@
 #include "VORScript.h"
 
+#include <algorithm>
 #include <cstdlib>
 #include <functional>
 #include <map>
 #include <sstream>
 
 #include "VORDlgCombo.h"
+#include "VORDlgSelectorList.h"
 #include "VORDriver.h"
 #include "VORFileIO.h"
 #include "VORModelChecker.h"
@@ -28,8 +30,16 @@ std::string DialogWithOKState(const VORDriver& driver, const std::string& name) 
 bool PrintCombo(const VORDriver& driver, const std::string& dialogName, const std::string& name,
                 std::ostream& out, std::string& error) {
   const VORDlgDialog* dialog = driver.FindDialog(dialogName);
-  const auto* combo =
-      dialog ? dynamic_cast<const VORDlgCombo*>(dialog->FindControl(name)) : nullptr;
+  const VORDlgControl* control = dialog ? dialog->FindControl(name) : nullptr;
+  if (const auto* list = dynamic_cast<const VORDlgSelectorList*>(control)) {
+    const std::vector<int>& selected = list->GetSelect();
+    for (int i = 0; i < list->GetLineCount(); ++i)
+      out << "  line " << i + 1 << " \"" << list->GetLine(i).ConvertToUTF8() << "\""
+          << (std::find(selected.begin(), selected.end(), i) != selected.end() ? " [selected]" : "")
+          << "\n";
+    return true;
+  }
+  const auto* combo = dynamic_cast<const VORDlgCombo*>(control);
   if (combo == nullptr) {
     error = dialog ? "no combo \"" + name + "\" in dialog \"" + dialogName + "\""
                    : "no dialog \"" + dialogName + "\" is shown";
@@ -210,6 +220,13 @@ bool VORScript::Execute(const std::vector<std::string>& w, std::string& error) {
     return args(0, 0, "redo") && driverStep(_driver.Redo());
   if (step == "pick")
     return args(1, 1, "pick <object id or label>") && driverStep(_driver.PickObject(w[1]));
+  if (step == "select") {
+    if (n == 0) {
+      error = "usage: select <object> [<object> ...]";
+      return false;
+    }
+    return driverStep(_driver.SelectObjects(std::vector<std::string>(w.begin() + 1, w.end())));
+  }
   if (step == "pick-at" || step == "context") {
     std::vector<double> v;
     std::string window;

@@ -1,6 +1,7 @@
 #include "VORQtDialogs.h"
 
 #include <QCheckBox>
+#include <QFontMetrics>
 #include <QCloseEvent>
 #include <QComboBox>
 #include <QDialogButtonBox>
@@ -11,6 +12,7 @@
 #include <QListWidget>
 #include <QPushButton>
 #include <QSignalBlocker>
+#include <QStyle>
 #include <QTimer>
 #include <QVBoxLayout>
 #include <algorithm>
@@ -156,8 +158,18 @@ QWidget* VORQtDialogWidget::MakeWidget(VORDlgControl* control) {
     widget = check;
   } else if (kind == "SelectorList") {
     auto* list = new QListWidget();
-    list->setSelectionMode(QAbstractItemView::ExtendedSelection);
     auto* selector = static_cast<VORDlgSelectorList*>(control);
+    list->setSelectionMode((selector->GetStyle() & VORDlgLstSingleSelection) != 0
+                               ? QAbstractItemView::SingleSelection
+                               : QAbstractItemView::ExtendedSelection);
+    // The size the dialog asks for, in characters and lines of the list's font.
+    const QFontMetrics metrics = list->fontMetrics();
+    const int frame = 2 * list->frameWidth();
+    if (selector->GetVisibleColumns() > 0)
+      list->setMinimumWidth(metrics.averageCharWidth() * selector->GetVisibleColumns() + frame +
+                            list->style()->pixelMetric(QStyle::PM_ScrollBarExtent));
+    if (selector->GetVisibleLines() > 0)
+      list->setFixedHeight((metrics.lineSpacing() + 2) * selector->GetVisibleLines() + frame);
     connect(list, &QListWidget::itemSelectionChanged, this, [list, selector]() {
       std::vector<int> rows;
       for (QListWidgetItem* item : list->selectedItems())

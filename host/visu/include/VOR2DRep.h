@@ -35,6 +35,8 @@ struct VORFlattenContext {
 // One pick: the reps from the picked top-level rep down to the leaf that was hit.
 struct VORPickHit {
   std::vector<VOR2DRep*> reps;
+  // The leaf is under the point itself, not only within the tolerance of it.
+  bool exact = false;
 };
 
 // Process-wide counter bumped by every change of any rep; viewers rebuild their render list when

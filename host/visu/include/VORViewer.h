@@ -123,7 +123,8 @@ class VORViewer : public VORCommand {
   std::vector<VORPathElement_var> PickPaths(double px, double py);
   // The same at a model point (a manipulator's point), with the same pixel tolerance.
   std::vector<VORPathElement_var> PickPathsAtModelPoint(double x, double y);
-  // Rep chains under a model point, front to back (the viewer's own reps below the set's).
+  // Rep chains under a model point: those under the point itself first, then those within the
+  // tolerance, each front to back (the viewer's own reps below the set's).
   std::vector<VORPickHit> PickReps(double x, double y, double tolerance);
 
   void SetCursor(int shape) { _cursor = shape; }

@@ -116,6 +116,7 @@ void VOR2DRep::CollectPicks(const VORMathPoint2D& p, double tolerance,
   VORPickHit hit;
   hit.reps = chain;
   hit.reps.push_back(this);
+  hit.exact = tolerance <= 0.0 || (GetBoundingBox().Contains(p.x, p.y, 0.0) && HitTest(p, 0.0));
   out.push_back(std::move(hit));
 }
 

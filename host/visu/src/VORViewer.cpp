@@ -239,6 +239,9 @@ std::vector<VORPickHit> VORViewer::PickReps(double x, double y, double tolerance
   }
   for (auto rep = _reps.rbegin(); rep != _reps.rend(); ++rep)
     (*rep)->CollectPicks(p, tolerance, chain, hits);
+  // What is under the point itself goes before what is only near it, so that in a dense list
+  // the line clicked on wins over its neighbour drawn in front of it.
+  std::stable_partition(hits.begin(), hits.end(), [](const VORPickHit& h) { return h.exact; });
   return hits;
 }
 
