@@ -108,4 +108,3 @@ void BM_DropInputOnNextStation(benchmark::State& state) {
 
 BENCHMARK(BM_DropInputOnNextStation)->Arg(10000)->Unit(benchmark::kMillisecond)->Iterations(20);
 
-BENCHMARK_MAIN();
