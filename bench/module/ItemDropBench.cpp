@@ -107,4 +107,3 @@ void BM_DropInputOnNextStation(benchmark::State& state) {
 }  // namespace
 
 BENCHMARK(BM_DropInputOnNextStation)->Arg(10000)->Unit(benchmark::kMillisecond)->Iterations(20);
-
