@@ -13,10 +13,10 @@
 #include "QELPFVLayoutCore.h"
 #include "QELPFVNodeOrganiser.h"
 #include "QELPertClientVisuServices.h"
+#include "VORApplicationFrame.h"
 #include "VORDeferredDeletion.h"
 #include "VORDocument.h"
 #include "VORDriver.h"
-#include "VORFileIO.h"
 #include "VORModelDoor.h"
 
 namespace {
@@ -126,7 +126,7 @@ void BM_PlainLongestPathLayering(benchmark::State& state) {
   state.SetItemsProcessed(state.iterations() * state.range(0));
 }
 
-// A process document whose root holds a generated line of n stations.
+// A process document whose root holds a generated line of n stations, named "Line".
 VORProcess_var MakeLineDocument(int n) {
   VORProcess_var doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
   VORBaseUnknown_var root = doc->GetRootProcess();
@@ -166,25 +166,12 @@ VORProcess_var MakeEquippedLineDocument(int n) {
   return doc;
 }
 
-std::string EquippedLineFile(int n) {
-  const std::string file = "/tmp/pfv-module-bench-equipped-line-" + std::to_string(n) + ".pprx";
-  static std::vector<int> written;
-  if (std::find(written.begin(), written.end(), n) == written.end()) {
-    std::string error;
-    MakeEquippedLineDocument(n)->SaveAs(file, error);
-    written.push_back(n);
-  }
-  return file;
-}
-
-const std::string& LineFile(int n) {
-  static std::string file;
-  if (file.empty()) {
-    file = "/tmp/pfv-module-bench-line-" + std::to_string(n) + ".pprx";
-    std::string error;
-    MakeLineDocument(n)->SaveAs(file, error);
-  }
-  return file;
+// Opens a newly generated level of n stations in a new editor of the driver's frame (each
+// benchmark starts from a level no viewer has shown yet).
+bool OpenLine(VORDriver& driver, int n, bool equipped) {
+  VORProcess_var doc = equipped ? MakeEquippedLineDocument(n) : MakeLineDocument(n);
+  return VORApplicationFrame::GetApplicationFrame()->OpenDocument(doc) != nullptr &&
+         driver.PickObject("Line");
 }
 
 QELFpaProductFlowViewer* FindViewer() {
@@ -198,9 +185,8 @@ QELFpaProductFlowViewer* FindViewer() {
 // links refreshed, one position notification per node.
 void BM_ArrangeNodesWithRefresh(benchmark::State& state) {
   VORDriver driver;
-  if (!driver.OpenDocument(LineFile(static_cast<int>(state.range(0)))) ||
-      !driver.PickObject("Line") || !driver.StartCommand("QELFpaProductFlowViewerCmd") ||
-      FindViewer() == nullptr) {
+  if (!OpenLine(driver, static_cast<int>(state.range(0)), false) ||
+      !driver.StartCommand("QELFpaProductFlowViewerCmd") || FindViewer() == nullptr) {
     state.SkipWithError(("cannot open the viewer: " + driver.LastError()).c_str());
     return;
   }
@@ -217,16 +203,15 @@ void BM_ArrangeNodesWithRefresh(benchmark::State& state) {
 
 // Opens the viewer on the level of file once per iteration; closing it and forgetting the
 // positions (so every node is new again) are not timed.
-void OpenViewerRepeatedly(benchmark::State& state, const std::string& file) {
+void OpenViewerRepeatedly(benchmark::State& state, bool equipped) {
   VORDriver driver;
-  if (!driver.OpenDocument(file)) {
-    state.SkipWithError(driver.LastError().c_str());
+  if (!OpenLine(driver, static_cast<int>(state.range(0)), equipped)) {
+    state.SkipWithError(("cannot open the level: " + driver.LastError()).c_str());
     return;
   }
   VORProcess* doc = driver.GetDocument();
   VORListValVORBaseUnknown_var* children = nullptr;
   VORIGENode_var(doc->GetRootProcess())->GetChildren(children);
-  driver.PickObject("Line");
   for (auto _ : state) {
     if (!driver.StartCommand("QELFpaProductFlowViewerCmd") || FindViewer() == nullptr) {
       state.SkipWithError(driver.LastError().c_str());
@@ -245,14 +230,14 @@ void OpenViewerRepeatedly(benchmark::State& state, const std::string& file) {
 // Picking the level and running the viewer command: window, viewer, controller with every node
 // box and link, and the first layout of all (new) nodes.
 void BM_OpenViewer(benchmark::State& state) {
-  OpenViewerRepeatedly(state, LineFile(static_cast<int>(state.range(0))));
+  OpenViewerRepeatedly(state, false);
 }
 
 // Opening the viewer on a line whose stations each list one input, one output and one
 // resource: as above, plus every station's ZitBlts built, their list commands created and run,
 // and each list drawn with its item.
 void BM_OpenViewerWithLists(benchmark::State& state) {
-  OpenViewerRepeatedly(state, EquippedLineFile(static_cast<int>(state.range(0))));
+  OpenViewerRepeatedly(state, true);
 }
 
 }  // namespace
@@ -267,10 +252,18 @@ BENCHMARK(BM_PlainLongestPathLayering)
     ->Arg(20000)
     ->Arg(100000)
     ->Unit(benchmark::kMillisecond);
-BENCHMARK(BM_ArrangeNodesWithRefresh)->Arg(10000)->Unit(benchmark::kMillisecond);
-BENCHMARK(BM_OpenViewer)->Arg(10000)->Unit(benchmark::kMillisecond)->Iterations(5);
+// Opening and organising at 1,000, 10,000 and 100,000 stations; the largest level runs once.
+BENCHMARK(BM_ArrangeNodesWithRefresh)
+    ->Arg(1000)
+    ->Arg(10000)
+    ->Unit(benchmark::kMillisecond)
+    ->Iterations(10);
+BENCHMARK(BM_ArrangeNodesWithRefresh)->Arg(100000)->Unit(benchmark::kMillisecond)->Iterations(1);
+BENCHMARK(BM_OpenViewer)->Arg(1000)->Arg(10000)->Unit(benchmark::kMillisecond)->Iterations(5);
+BENCHMARK(BM_OpenViewer)->Arg(100000)->Unit(benchmark::kMillisecond)->Iterations(1);
 BENCHMARK(BM_OpenViewerWithLists)
     ->Arg(1000)
-    ->Arg(2000)
+    ->Arg(10000)
     ->Unit(benchmark::kMillisecond)
     ->Iterations(5);
+BENCHMARK(BM_OpenViewerWithLists)->Arg(100000)->Unit(benchmark::kMillisecond)->Iterations(1);

@@ -1,4 +1,5 @@
 #include <cmath>
+#include <functional>
 #include <numbers>
 
 #include "VOR2DArcCircleRep.h"
@@ -118,6 +119,61 @@ TEST_F(RepBoxTest, NestedBagsMapChildBoxesThroughEveryMatrixAndIgnoreHiddenChild
   inner->SetShowMode(1);
   EXPECT_TRUE(root->GetBoundingBox().IsEmpty());
   EXPECT_FALSE(inner->GetBoundingBox().IsEmpty());
+}
+
+TEST_F(RepBoxTest, BagsMovedByTheirMatrixAnswerTheBoxOfAFreshComputationOverRandomChanges) {
+  // A moved bag maps its children's box again without visiting them: whatever mix of moves,
+  // child changes and reads, the root's box is the box computed from scratch.
+  auto root = Make<VOR2DBagRep>();
+  auto inner = Make<VOR2DBagRep>();
+  auto line = Make<VOR2DLineRep>(0.0f, 0.0f, 4.0f, 2.0f);
+  auto point = Make<VOR2DPointRep>(9.0f, -3.0f, 4);
+  inner->AddChild(line);
+  inner->AddChild(point);
+  root->AddChild(inner);
+  std::function<VORBox2D(const VOR2DRep*)> fresh = [&](const VOR2DRep* rep) {
+    const auto* bag = dynamic_cast<const VOR2DBagRep*>(rep);
+    if (bag == nullptr)
+      return rep->GetBoundingBox();
+    VORBox2D box;
+    for (const VOR2DRep_var& child : bag->GetChildren()) {
+      if (child->IsShown())
+        box.Extend(fresh(child.get()));
+    }
+    return bag->GetMatrix() != nullptr ? bag->GetMatrix()->TransformBox(box) : box;
+  };
+  unsigned state = 99;
+  auto next = [&](unsigned n) {
+    state = state * 1103515245u + 12345u;
+    return (state >> 8) % n;
+  };
+  for (int step = 0; step < 500; ++step) {
+    const double dx = static_cast<double>(next(40)) - 20.0;
+    const double dy = static_cast<double>(next(40)) - 20.0;
+    switch (next(6)) {
+      case 0:
+        inner->SetMatrix(VOR3x3Matrix::Translation(dx, dy));
+        break;
+      case 1:
+        root->SetMatrix(VOR3x3Matrix::Translation(dx, dy));
+        break;
+      case 2:
+        line->Modify({0.0f, 0.0f}, {static_cast<float>(dx), static_cast<float>(dy)});
+        break;
+      case 3:
+        point->SetShowMode(point->IsShown() ? 1 : 0);
+        break;
+      case 4:
+        (void)inner->GetBoundingBox();  // a read between changes caches the inner box only
+        break;
+      default:
+        inner->ResetMatrix();
+        break;
+    }
+    if (next(3) == 0) {
+      EXPECT_EQ(root->GetBoundingBox(), fresh(root.get())) << "step " << step;
+    }
+  }
 }
 
 TEST_F(RepBoxTest, BagsRefuseCyclesAndMoveChildrenBetweenFathers) {

@@ -28,6 +28,28 @@ std::map<VORUnicodeString, VORPixelImage_var>& IconCache() {
   return cache;
 }
 
+// The button images as drawn (converted to RGBA, opaque), in colour [0] and in grey [1], by
+// icon file name. Nothing changes a button's image once it is drawn, so every button of an icon
+// shares them: a level of thousands of ZitBlts converts each icon twice, not once per button.
+std::map<VORUnicodeString, VORPixelImage_var[2]>& ButtonImageCache() {
+  static std::map<VORUnicodeString, VORPixelImage_var[2]> cache;
+  return cache;
+}
+
+VORPixelImage* ButtonImage(const VORUnicodeString& fileName, bool grey) {
+  VORPixelImage_var& slot = ButtonImageCache()[fileName][grey ? 1 : 0];
+  if (!slot) {
+    slot = VORPixelImage_var::Adopt(QELZitBltRep::LoadIconImage(fileName));
+    if (!slot)
+      return nullptr;
+    if (grey)
+      slot->Convert(VORPixelImage::Grey);
+    slot->Convert(VORPixelImage::RGBA);
+    slot->SetTransparency(0);
+  }
+  return slot.get();
+}
+
 }  // namespace
 
 VORPixelImage* QELZitBltRep::LoadIconImage(const VORUnicodeString& fileName) {
@@ -88,6 +110,7 @@ void QELZitBltIconOffset(const VORUnicodeString& location, float w, float h, flo
 
 void QELZitBltRep::ForgetIcons() {
   IconCache().clear();
+  ButtonImageCache().clear();
 }
 
 QELZitBltRep::QELZitBltRep() : VORCommand(nullptr, "QELZitBltRep") {}
@@ -158,10 +181,9 @@ void QELZitBltRep::BuildRep(VORViewer* viewer) {
 void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
   if (!_btnBag)
     return;
-  VORPixelImage* image = LoadIconImage(_icon + VORUnicodeString(".bmp"));
-  if (image == nullptr)
+  VORPixelImage_var image(ButtonImage(_icon + VORUnicodeString(".bmp"), grey == 1));
+  if (!image)
     return;
-  image->AddRef();
   for (int i = _btnBag->GetSize(); i >= 1; --i)
     _btnBag->DestroyChild(_btnBag->GetChild(i));
 
@@ -173,18 +195,10 @@ void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
   float oy = 0.0f;
   QELZitBltIconOffset(_location, xmax - xmin, ymax - ymin, ox, oy);
   imageRep->Modify(VORMathPoint2Df(static_cast<float>(ox - 2.0), static_cast<float>(oy - 2.0)));
-
-  VORPixelImage* pixels = imageRep->GetPixelImage();
-  if (grey == 1)
-    pixels->Convert(VORPixelImage::Grey);
-  pixels->Convert(VORPixelImage::RGBA);
-  pixels->SetTransparency(0);
   imageRep->SetAlphaMode(1);
 
   _btnBag->AddChild(imageRep);
   _grey = grey == 1;
-  image->Release();
-  image->Release();
 }
 
 void QELZitBltRep::SetShowMode(int mode) {

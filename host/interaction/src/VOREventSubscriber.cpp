@@ -16,8 +16,9 @@ VORCallbackId VOREventSubscriber::AddCallback(VOREventPublisher* publisher,
     return 0;
   VORCallbackId id = publisher->AddCallback(
       notificationName,
-      [method](VORBaseUnknown* owner, const std::string&, VORNotification* notification, void* data,
-               VORCallbackId) { method(owner, notification, data); },
+      [method = std::move(method)](VORBaseUnknown* owner, const std::string&,
+                                   VORNotification* notification, void* data,
+                                   VORCallbackId) { method(owner, notification, data); },
       clientData, this);
   _subscriptions.push_back(Subscription{VORHandle<VOREventPublisher>(publisher), id});
   return id;

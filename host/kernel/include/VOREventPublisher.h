@@ -63,18 +63,27 @@ class VOREventPublisher : public VORBaseUnknown {
   struct Entry;
   struct Channel;
   using EntryPtr = std::shared_ptr<Entry>;
-  struct NameHash {
-    using is_transparent = void;
-    size_t operator()(std::string_view s) const { return std::hash<std::string_view>{}(s); }
-  };
 
   VORCallbackId Add(const void* key, const std::string& name, VORCallbackFunction callback,
                     void* clientData, const void* subscriber);
   void Forget(const EntryPtr& entry);
   Channel* Find(std::string_view name) const;
+  const EntryPtr* FindLive(VORCallbackId id) const;
+  void CompactLive();
   int Run(const std::string& event, VORNotification* notification, bool keyed, const void* key);
 
-  std::unordered_map<std::string, std::unique_ptr<Channel>, NameHash, std::equal_to<>> _channels;
-  std::unordered_map<VORCallbackId, EntryPtr> _live;
+  // A publisher has few names (a manipulator four, a model object a handful): they are searched
+  // in order, and indexed by name only once there are many.
+  std::vector<std::unique_ptr<Channel>> _channels;
+  std::unordered_map<std::string_view, Channel*> _channelIndex;
+  // Every callback by id (ids only grow, so appending keeps the order); a removed one stays,
+  // flagged, until half of them are removed and no dispatch runs.
+  std::vector<EntryPtr> _live;
+  size_t _liveRemoved = 0;
+  // Dispatches running on this publisher, their lists of due callbacks (kept for reuse), and
+  // the callbacks removed meanwhile, whose function objects go when the outermost one ends.
+  int _running = 0;
+  std::vector<std::vector<Entry*>> _due;
+  std::vector<EntryPtr> _retired;
   VORBaseUnknown* _owner;
 };

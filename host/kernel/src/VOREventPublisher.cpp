@@ -23,10 +23,16 @@ struct VOREventPublisher::Entry {
 
 // The callbacks of one name, each list in registration order (ids grow with every addition).
 struct VOREventPublisher::Channel {
+  std::string name;
   std::vector<EntryPtr> unkeyed;
   size_t unkeyedRemoved = 0;  // flagged removed, not yet erased
   std::unordered_map<const void*, std::vector<EntryPtr>> byKey;
 };
+
+namespace {
+// Names a publisher searches in order before it indexes them.
+constexpr size_t kChannelsSearchedInOrder = 8;
+}  // namespace
 
 VOREventPublisher::VOREventPublisher(VORBaseUnknown* owner) : _owner(owner) {}
 
@@ -50,26 +56,53 @@ VORCallbackId VOREventPublisher::Add(const void* key, const std::string& name,
                                      const void* subscriber) {
   if (!callback)
     return 0;
-  auto it = _channels.find(name);
-  if (it == _channels.end())
-    it = _channels.emplace(name, std::make_unique<Channel>()).first;
-  Channel* channel = it->second.get();
+  Channel* channel = Find(name);
+  if (channel == nullptr) {
+    _channels.push_back(std::make_unique<Channel>());
+    channel = _channels.back().get();
+    channel->name = name;
+    if (!_channelIndex.empty()) {
+      _channelIndex.emplace(channel->name, channel);
+    } else if (_channels.size() > kChannelsSearchedInOrder) {
+      for (const auto& c : _channels)
+        _channelIndex.emplace(c->name, c.get());
+    }
+  }
   auto entry = std::make_shared<Entry>(
       Entry{++nextId, key, std::move(callback), clientData, subscriber, channel});
   if (key != nullptr)
     channel->byKey[key].push_back(entry);
   else
     channel->unkeyed.push_back(entry);
-  _live.emplace(entry->id, entry);
-  return entry->id;
+  _live.push_back(std::move(entry));
+  return _live.back()->id;
+}
+
+const VOREventPublisher::EntryPtr* VOREventPublisher::FindLive(VORCallbackId id) const {
+  auto it =
+      std::lower_bound(_live.begin(), _live.end(), id,
+                       [](const EntryPtr& e, VORCallbackId wanted) { return e->id < wanted; });
+  if (it == _live.end() || (*it)->id != id || (*it)->removed)
+    return nullptr;
+  return &*it;
+}
+
+void VOREventPublisher::CompactLive() {
+  std::erase_if(_live, [](const EntryPtr& e) { return e->removed; });
+  _liveRemoved = 0;
 }
 
 void VOREventPublisher::Forget(const EntryPtr& entry) {
   entry->removed = true;
-  entry->callback = nullptr;  // what the callback holds goes now (a running one was copied)
+  // What the callback holds goes now, unless a dispatch of this publisher may be running it:
+  // then when that dispatch ends.
+  if (_running > 0)
+    _retired.push_back(entry);
+  else
+    entry->callback = nullptr;
   Channel* channel = entry->channel;
   if (entry->key != nullptr) {
-    // One key's list is short: erase at once (running dispatches work on their own copy).
+    // One key's list is short: erase at once (running dispatches work on their own list).
     auto list = channel->byKey.find(entry->key);
     std::erase(list->second, entry);
     if (list->second.empty())
@@ -79,22 +112,24 @@ void VOREventPublisher::Forget(const EntryPtr& entry) {
     std::erase_if(channel->unkeyed, [](const EntryPtr& e) { return e->removed; });
     channel->unkeyedRemoved = 0;
   }
-  _live.erase(entry->id);
+  // Running dispatches point at removed entries too: they stay until no dispatch runs.
+  if (++_liveRemoved * 2 >= _live.size() && _running == 0)
+    CompactLive();
 }
 
 bool VOREventPublisher::RemoveCallback(VORCallbackId id) {
-  auto it = _live.find(id);
-  if (it == _live.end())
+  const EntryPtr* found = FindLive(id);
+  if (found == nullptr)
     return false;
-  EntryPtr entry = it->second;
+  const EntryPtr entry = *found;  // Forget may compact _live
   Forget(entry);
   return true;
 }
 
 int VOREventPublisher::RemoveCallbacksOf(const void* subscriber) {
   std::vector<EntryPtr> gone;
-  for (const auto& [id, entry] : _live) {
-    if (entry->subscriber == subscriber)
+  for (const EntryPtr& entry : _live) {
+    if (!entry->removed && entry->subscriber == subscriber)
       gone.push_back(entry);
   }
   for (const EntryPtr& entry : gone)
@@ -103,25 +138,46 @@ int VOREventPublisher::RemoveCallbacksOf(const void* subscriber) {
 }
 
 VOREventPublisher::Channel* VOREventPublisher::Find(std::string_view name) const {
-  auto it = _channels.find(name);
-  return it == _channels.end() ? nullptr : it->second.get();
+  if (!_channelIndex.empty()) {
+    auto it = _channelIndex.find(name);
+    return it == _channelIndex.end() ? nullptr : it->second;
+  }
+  for (const auto& channel : _channels) {
+    if (channel->name == name)
+      return channel.get();
+  }
+  return nullptr;
 }
 
 int VOREventPublisher::Run(const std::string& event, VORNotification* notification, bool keyed,
                            const void* key) {
   // The channels of the event and of the notification's classes, each once.
-  std::vector<Channel*> channels;
+  Channel* channels[16];
+  size_t channelCount = 0;
   auto take = [&](Channel* c) {
-    if (c != nullptr && std::find(channels.begin(), channels.end(), c) == channels.end())
-      channels.push_back(c);
+    if (c == nullptr || channelCount == std::size(channels) ||
+        std::find(channels, channels + channelCount, c) != channels + channelCount)
+      return;
+    channels[channelCount++] = c;
   };
   take(Find(event));
   if (notification != nullptr) {
     for (const VORMetaObject* m = notification->GetMetaObject(); m != nullptr; m = m->Base())
       take(Find(m->ClassName()));
   }
+  if (channelCount == 0)
+    return 0;
+
+  // Keep the publisher alive: a callback may drop the last handle on its owner.
+  VORHandle<VOREventPublisher> guard(this);
+  if (_due.size() <= static_cast<size_t>(_running))
+    _due.emplace_back();
+  ++_running;
   // Only the callbacks present now; several lists are merged back into registration order.
-  std::vector<EntryPtr> due;
+  // The entries stay alive while a dispatch runs (removed ones are kept in _live meanwhile).
+  std::vector<Entry*> due;
+  due.swap(_due[static_cast<size_t>(_running - 1)]);
+  due.clear();
   int lists = 0;
   auto append = [&](const std::vector<EntryPtr>& list) {
     if (list.empty())
@@ -129,10 +185,11 @@ int VOREventPublisher::Run(const std::string& event, VORNotification* notificati
     ++lists;
     for (const EntryPtr& e : list) {
       if (!e->removed)
-        due.push_back(e);
+        due.push_back(e.get());
     }
   };
-  for (Channel* c : channels) {
+  for (size_t i = 0; i < channelCount; ++i) {
+    Channel* c = channels[i];
     append(c->unkeyed);
     if (keyed) {
       if (auto it = c->byKey.find(key); it != c->byKey.end())
@@ -143,20 +200,26 @@ int VOREventPublisher::Run(const std::string& event, VORNotification* notificati
     }
   }
   if (lists > 1)
-    std::sort(due.begin(), due.end(),
-              [](const EntryPtr& a, const EntryPtr& b) { return a->id < b->id; });
+    std::sort(due.begin(), due.end(), [](const Entry* a, const Entry* b) { return a->id < b->id; });
 
-  // Keep the publisher alive: a callback may drop the last handle on its owner.
-  VORHandle<VOREventPublisher> guard(this);
   int called = 0;
-  for (const EntryPtr& e : due) {
+  for (Entry* e : due) {
     if (e->removed)
       continue;
-    // Copy: the callback may remove itself, which drops its function object.
-    VORCallbackFunction callback = e->callback;
-    callback(_owner ? _owner : this, event, notification, e->clientData, e->id);
+    // A callback removed while it runs keeps its function object until the dispatch ends.
+    e->callback(_owner ? _owner : this, event, notification, e->clientData, e->id);
     ++called;
     ++callbacksRun;
+  }
+  due.clear();
+  due.swap(_due[static_cast<size_t>(_running - 1)]);
+  if (--_running == 0) {
+    std::vector<EntryPtr> retired;
+    retired.swap(_retired);
+    for (const EntryPtr& e : retired)
+      e->callback = nullptr;
+    if (_liveRemoved * 2 >= _live.size() && _liveRemoved > 0)
+      CompactLive();
   }
   return called;
 }
@@ -179,11 +242,11 @@ unsigned long long VOREventPublisher::CallbacksRun() {
 }
 
 int VOREventPublisher::CallbackCount() const {
-  return static_cast<int>(_live.size());
+  return static_cast<int>(_live.size() - _liveRemoved);
 }
 
 bool VOREventPublisher::HasCallback(VORCallbackId id) const {
-  return _live.count(id) != 0;
+  return FindLive(id) != nullptr;
 }
 
 int VOREventPublisher::KeyedCallbackCount(const void* key, const std::string& name) const {

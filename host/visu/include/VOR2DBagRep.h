@@ -50,6 +50,8 @@ class VOR2DBagRep : public VOR2DRep {
 
  private:
   void Detach(VOR2DRep* child);
+  // The matrix changed: the box in the father's frame is stale, the children's box is not.
+  void InvalidateFrame();
   // Point of the father's frame in the children's frame; false when the matrix is singular.
   bool ToLocal(const VORMathPoint2D& p, VORMathPoint2D& local, double& scale) const;
 

@@ -104,8 +104,15 @@ class VOR2DRep : public VORBaseUnknown {
   std::string _tag;
   VOR2DBagRep* _father = nullptr;
   VORManipulator* _manipulator = nullptr;
+  // Fathers' boxes only, for a rep whose own frame moved (its children's box stays valid).
+  void InvalidateFathers();
+
   mutable VORBox2D _box;
   mutable bool _boxValid = false;
+  // Bags: the box of the children in the bag's own frame is valid. It implies _boxValid's
+  // inputs are all valid, so a bag whose matrix alone changed maps its children's box again
+  // instead of visiting them.
+  mutable bool _localValid = false;
 };
 VOR_DECLARE_HANDLE(VOR2DRep);
 

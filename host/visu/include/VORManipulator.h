@@ -77,11 +77,11 @@ class VORManipulator : public VORCommand {
   int GetElementCount() const { return static_cast<int>(_reps.size()); }
   const std::vector<VORHandle<VOR2DRep>>& GetElements() const { return _reps; }
 
-  VORNotification* GetVORPreactivate() const { return _preactivate; }
-  VORNotification* GetVOREndPreactivate() const { return _endPreactivate; }
-  VORNotification* GetVORActivate() const { return _activate; }
-  VORNotification* GetVORManipulate() const { return _manipulate; }
-  VORNotification* GetVOREndManipulate() const { return _endManipulate; }
+  VORNotification* GetVORPreactivate() const { return Notification(kPreactivateSlot); }
+  VORNotification* GetVOREndPreactivate() const { return Notification(kEndPreactivateSlot); }
+  VORNotification* GetVORActivate() const { return Notification(kActivateSlot); }
+  VORNotification* GetVORManipulate() const { return Notification(kManipulateSlot); }
+  VORNotification* GetVOREndManipulate() const { return Notification(kEndManipulateSlot); }
 
   // The viewer driving the current gesture (null between gestures) and the last pointer point.
   VORViewer* GetViewer() const { return _viewer; }
@@ -118,11 +118,18 @@ class VORManipulator : public VORCommand {
   VORMathVector2Df _direction;
   VORMathAxis2D _position;
   std::vector<VORHandle<VOR2DRep>> _reps;
-  VORHandle<VORManipulatorNotification> _preactivate;
-  VORHandle<VORManipulatorNotification> _endPreactivate;
-  VORHandle<VORManipulatorNotification> _activate;
-  VORHandle<VORManipulatorNotification> _manipulate;
-  VORHandle<VORManipulatorNotification> _endManipulate;
+  enum Slot {
+    kPreactivateSlot,
+    kEndPreactivateSlot,
+    kActivateSlot,
+    kManipulateSlot,
+    kEndManipulateSlot,
+    kSlotCount
+  };
+  // The notification of one gesture event, made on first use: a chart has thousands of
+  // manipulators and most never see a gesture.
+  VORManipulatorNotification* Notification(Slot slot) const;
+  mutable VORHandle<VORManipulatorNotification> _notifications[kSlotCount];
   VORViewer* _viewer = nullptr;
   VORHandle<VOR2DRep> _pressed_element;
   VORMathPoint2D _current;

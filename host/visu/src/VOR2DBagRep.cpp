@@ -77,7 +77,7 @@ void VOR2DBagRep::SetMatrix(const VOR3x3Matrix& matrix) {
   _matrix = matrix;
   _hasMatrix = true;
   _invertible = matrix.Invert(_inverse);
-  Invalidate();
+  InvalidateFrame();
 }
 
 void VOR2DBagRep::ResetMatrix() {
@@ -85,18 +85,27 @@ void VOR2DBagRep::ResetMatrix() {
   _inverse = VOR3x3Matrix();
   _hasMatrix = false;
   _invertible = true;
-  Invalidate();
+  InvalidateFrame();
+}
+
+void VOR2DBagRep::InvalidateFrame() {
+  Touch();
+  _boxValid = false;
+  InvalidateFathers();
 }
 
 VORBox2D VOR2DBagRep::ComputeBoundingBox() const {
-  VORBox2D box;
-  for (const VOR2DRep_var& child : _children) {
-    if (child->IsShown())
-      box.Extend(child->GetBoundingBox());
+  if (!_localValid) {
+    VORBox2D box;
+    for (const VOR2DRep_var& child : _children) {
+      if (child->IsShown())
+        box.Extend(child->GetBoundingBox());
+    }
+    _localBox = box;
+    _localValid = true;
+    ++_boxVersion;
   }
-  _localBox = box;
-  ++_boxVersion;
-  return _hasMatrix ? _matrix.TransformBox(box) : box;
+  return _hasMatrix ? _matrix.TransformBox(_localBox) : _localBox;
 }
 
 namespace {

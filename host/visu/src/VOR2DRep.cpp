@@ -74,9 +74,17 @@ void VOR2DRep::GetBoundingBox(float& xmin, float& ymin, float& xmax, float& ymax
 void VOR2DRep::Invalidate() {
   Touch();
   _boxValid = false;
-  // A valid father only ever holds valid children, so the walk stops at the first invalid one.
-  for (VOR2DRep* r = _father; r != nullptr && r->_boxValid; r = r->_father)
+  _localValid = false;
+  InvalidateFathers();
+}
+
+void VOR2DRep::InvalidateFathers() {
+  // A father whose children's box is valid only ever holds valid children, so the walk stops at
+  // the first father whose children's box is already invalid.
+  for (VOR2DRep* r = _father; r != nullptr && r->_localValid; r = r->_father) {
     r->_boxValid = false;
+    r->_localValid = false;
+  }
 }
 
 void VOR2DRep::Flatten(VORFlattenContext& context) const {

@@ -7,16 +7,18 @@
 #include "VOR2DRep.h"
 
 VORManipulator::VORManipulator(VORCommand* father, const VORString& name, int style)
-    : VORCommand(father, name), _style(style) {
-  auto make = [this](const char* event) {
-    return VORHandle<VORManipulatorNotification>::Adopt(
-        new VORManipulatorNotification(this, event));
-  };
-  _preactivate = make(kVORPreactivate);
-  _endPreactivate = make(kVOREndPreactivate);
-  _activate = make(kVORActivate);
-  _manipulate = make(kVORManipulate);
-  _endManipulate = make(kVOREndManipulate);
+    : VORCommand(father, name), _style(style) {}
+
+VORManipulatorNotification* VORManipulator::Notification(Slot slot) const {
+  VORHandle<VORManipulatorNotification>& notification = _notifications[slot];
+  if (!notification) {
+    static constexpr const char* kEvents[kSlotCount] = {
+        kVORPreactivate, kVOREndPreactivate, kVORActivate, kVORManipulate, kVOREndManipulate};
+    // The manipulator stays the notification's sender, as when it was made up front.
+    notification = VORHandle<VORManipulatorNotification>::Adopt(
+        new VORManipulatorNotification(const_cast<VORManipulator*>(this), kEvents[slot]));
+  }
+  return notification.get();
 }
 
 VORManipulator::~VORManipulator() {
@@ -85,7 +87,7 @@ void VORManipulator::Preactivate(VORViewer* viewer, const VORMathPoint2D& point,
   _preactivated = true;
   _viewer = viewer;
   _current = point;
-  Send(_preactivate, point, {}, modifiers);
+  Send(Notification(kPreactivateSlot), point, {}, modifiers);
 }
 
 void VORManipulator::EndPreactivate(VORViewer* viewer, const VORMathPoint2D& point, int modifiers) {
@@ -94,7 +96,7 @@ void VORManipulator::EndPreactivate(VORViewer* viewer, const VORMathPoint2D& poi
   _preactivated = false;
   _viewer = viewer;
   _current = point;
-  Send(_endPreactivate, point, {}, modifiers);
+  Send(Notification(kEndPreactivateSlot), point, {}, modifiers);
   if (!_pressed)
     _viewer = nullptr;
 }
@@ -123,7 +125,7 @@ void VORManipulator::PointerDrag(const VORMathPoint2D& point, int modifiers) {
   _position.origin.x += dx;
   _position.origin.y += dy;
   ApplyDrag({dx, dy});
-  Send(_manipulate, point, {dx, dy}, modifiers);
+  Send(Notification(kManipulateSlot), point, {dx, dy}, modifiers);
 }
 
 bool VORManipulator::PointerRelease(const VORMathPoint2D& point, int modifiers) {
@@ -135,9 +137,9 @@ bool VORManipulator::PointerRelease(const VORMathPoint2D& point, int modifiers) 
   _current = point;
   bool activated = false;
   if (wasDragging) {
-    Send(_endManipulate, point, {}, modifiers);
+    Send(Notification(kEndManipulateSlot), point, {}, modifiers);
   } else if (_style != 2) {
-    Send(_activate, point, {}, modifiers);
+    Send(Notification(kActivateSlot), point, {}, modifiers);
     activated = true;
   }
   if (!_preactivated)
