@@ -61,6 +61,28 @@ TEST_F(ComponentModelTest, HandlesShareOneReferenceCountAcrossInterfaces) {
   // The last handle deleted it; the fixture checks no instance is left.
 }
 
+TEST_F(ComponentModelTest, RepeatedCastsOfMixedTypesKeepTheirOwnAnswers) {
+  // Casts are remembered per (type, interface): interleaving types whose interfaces sit at
+  // different offsets, and answers that are "no", must never hand one pair's answer to another.
+  ITestLabel_var square = ITestLabel_var::Adopt(new Square());
+  ITestLabel_var coloured = ITestLabel_var::Adopt(new ColouredSquare());
+  ITestLabel_var circle = ITestLabel_var::Adopt(new Circle());
+  for (int round = 0; round < 3; ++round) {
+    for (const ITestLabel_var& label : {square, coloured, circle, coloured, square}) {
+      ITestShape_var shape(label);
+      ITestLabel_var back(shape);
+      const bool isSquare = label.get() != circle.get();
+      ASSERT_EQ(static_cast<bool>(shape), isSquare);
+      if (isSquare) {
+        EXPECT_EQ(shape->Corners(), 4);
+        EXPECT_EQ(back.get(), label.get());
+        EXPECT_STREQ(back->Label(), "square");
+      }
+      EXPECT_TRUE(!shape || shape == label);  // one object behind both interfaces
+    }
+  }
+}
+
 TEST_F(ComponentModelTest, NullHandlesCastToNull) {
   ITestShape_var none;
   ITestLabel_var stillNone(none);

@@ -23,7 +23,7 @@ VORString Narrow(const VORUnicodeString& s) {
 bool IsStatusBar(const VORUnicodeString& name) {
   for (const char* bar : {"BIWStationStatusBars", "BIWPointFasteningStatusBars",
                           "BIWCurveFasteningStatusBars", "BIWGroupingStatusBars"}) {
-    if (name == VORUnicodeString(bar))
+    if (QELIsKeyword(name, bar))
       return true;
   }
   return false;

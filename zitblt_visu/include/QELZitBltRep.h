@@ -5,6 +5,8 @@
 // the ZitBlt manager, which sets its strings, calls BuildRep and places it.
 #pragma once
 
+#include <string_view>
+
 #include "VOR2DBagRep.h"
 #include "VORCommand.h"
 #include "VORISO.h"
@@ -15,6 +17,9 @@
 
 class VOR2DManipulator;
 class QELBaseScrollListZitBltRep;
+
+// True when text is the ASCII keyword (a location or a ZitBlt name), without building a string.
+bool QELIsKeyword(const VORUnicodeString& text, std::string_view keyword);
 
 class QELZitBltRep : public VORCommand {
   VOR_DECLARE_CLASS(QELZitBltRep, VORCommand)
@@ -37,9 +42,9 @@ class QELZitBltRep : public VORCommand {
   virtual QELBaseScrollListZitBltRep* GetScrollListRep() { return nullptr; }
 
   void SetName(const VORUnicodeString& name) { _name = name; }
-  VORUnicodeString GetName() const { return _name; }
+  const VORUnicodeString& GetName() const { return _name; }
   void SetLocation(const VORUnicodeString& location) { _location = location; }
-  VORUnicodeString GetLocation() const { return _location; }
+  const VORUnicodeString& GetLocation() const { return _location; }
   void SetPriority(const VORUnicodeString& priority) { _priority = priority; }
   VORUnicodeString GetPriority() const { return _priority; }
   void SetInitialState(const VORUnicodeString& state) { _initialState = state; }

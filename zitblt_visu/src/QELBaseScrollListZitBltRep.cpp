@@ -23,7 +23,7 @@
 namespace {
 bool IsOneOf(const VORUnicodeString& location, std::initializer_list<const char*> keywords) {
   for (const char* k : keywords) {
-    if (location == VORUnicodeString(k))
+    if (QELIsKeyword(location, k))
       return true;
   }
   return false;
@@ -406,19 +406,19 @@ void QELBaseScrollListZitBltRep::AddScroller() {
     x0 = 0.0, x1 = 0.2, y0 = 5.0, y1 = length + 5.0;
     sx0 = -0.75, sx1 = 0.95, sy = t + 5.0;
     _growsUp = 1;
-  } else if (l == VORUnicodeString("lefttop")) {
+  } else if (QELIsKeyword(l, "lefttop")) {
     x0 = -5.0, x1 = -4.8, y0 = 0.0, y1 = length;
     sx0 = -5.75, sx1 = -4.05, sy = t;
     _growsUp = 1;
-  } else if (l == VORUnicodeString("righttop")) {
+  } else if (QELIsKeyword(l, "righttop")) {
     x0 = 5.0, x1 = 4.8, y0 = 0.0, y1 = length;
     sx0 = 4.25, sx1 = 5.55, sy = t;
     _growsUp = 1;
-  } else if (l == VORUnicodeString("leftbottom")) {
+  } else if (QELIsKeyword(l, "leftbottom")) {
     x0 = -5.0, x1 = -4.8, y0 = 0.0, y1 = -length;
     sx0 = -5.75, sx1 = -4.05, sy = -t;
     _growsUp = 0;
-  } else if (l == VORUnicodeString("rightbottom")) {
+  } else if (QELIsKeyword(l, "rightbottom")) {
     x0 = 5.0, x1 = 4.8, y0 = 0.0, y1 = -length;
     sx0 = 4.25, sx1 = 5.55, sy = -t;
     _growsUp = 0;

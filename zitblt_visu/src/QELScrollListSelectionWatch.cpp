@@ -8,14 +8,26 @@
 #include "QELBaseScrollListZitBltRep.h"
 
 namespace {
-// A list is known by its activity and its ZitBlt name, which every item component carries.
-using ListKey = std::pair<const VORBaseUnknown*, std::string>;
+// A list is known by its activity and its ZitBlt name, which every item component carries. The
+// few names a configuration uses are numbered once, so that registering the lists of a whole
+// level hashes no text.
+using ListKey = std::pair<const VORBaseUnknown*, int>;
 
 struct ListKeyHash {
   size_t operator()(const ListKey& key) const {
-    return std::hash<const void*>()(key.first) ^ (std::hash<std::string>()(key.second) << 1);
+    return std::hash<const void*>()(key.first) ^ (static_cast<size_t>(key.second) << 1);
   }
 };
+
+std::unordered_map<std::string, int>& NameNumbers() {
+  static std::unordered_map<std::string, int> numbers;
+  return numbers;
+}
+
+int NumberOf(const VORUnicodeString& name) {
+  auto& numbers = NameNumbers();
+  return numbers.try_emplace(name.ConvertToUTF8(), static_cast<int>(numbers.size())).first->second;
+}
 
 struct Watch {
   VORCSO_var cso;  // held: its address identifies the watch while lists use it
@@ -35,7 +47,7 @@ std::unordered_map<QELBaseScrollListZitBltRep*, std::pair<VORCSO*, ListKey>>& Ro
 }
 
 ListKey KeyOf(QELIScrollListZitBltItemVisu* item) {
-  return {item->GetAssociatedActivityNode(), item->GetZitBltName().ConvertToUTF8()};
+  return {item->GetAssociatedActivityNode(), NumberOf(item->GetZitBltName())};
 }
 
 // The list whose item the path names, or null.
@@ -83,7 +95,7 @@ void Add(VORCSO* cso, QELBaseScrollListZitBltRep* rep) {
         },
         nullptr, &watch);
   }
-  const ListKey key{rep->GetOwner(), rep->GetName().ConvertToUTF8()};
+  const ListKey key{rep->GetOwner(), NumberOf(rep->GetName())};
   watch.lists[key] = rep;
   Routes()[rep] = {cso, key};
 }

@@ -1,5 +1,6 @@
 #include "QELZitBltRep.h"
 
+#include <algorithm>
 #include <map>
 
 #include "VOR2DImagePixelRep.h"
@@ -14,7 +15,7 @@ namespace {
 bool IsHorizontalEdge(const VORUnicodeString& location) {
   for (const char* keyword :
        {"topleft", "topmiddle", "topright", "bottomleft", "bottommiddle", "bottomright"}) {
-    if (location == VORUnicodeString(keyword))
+    if (QELIsKeyword(location, keyword))
       return true;
   }
   return false;
@@ -29,17 +30,18 @@ std::map<VORUnicodeString, VORPixelImage_var>& IconCache() {
 }
 
 // The button images as drawn (converted to RGBA, opaque), in colour [0] and in grey [1], by
-// icon file name. Nothing changes a button's image once it is drawn, so every button of an icon
-// shares them: a level of thousands of ZitBlts converts each icon twice, not once per button.
+// icon name (without ".bmp"). Nothing changes a button's image once it is drawn, so every button of
+// an icon shares them: a level of thousands of ZitBlts converts each icon twice, not once per
+// button.
 std::map<VORUnicodeString, VORPixelImage_var[2]>& ButtonImageCache() {
   static std::map<VORUnicodeString, VORPixelImage_var[2]> cache;
   return cache;
 }
 
-VORPixelImage* ButtonImage(const VORUnicodeString& fileName, bool grey) {
-  VORPixelImage_var& slot = ButtonImageCache()[fileName][grey ? 1 : 0];
+VORPixelImage* ButtonImage(const VORUnicodeString& icon, bool grey) {
+  VORPixelImage_var& slot = ButtonImageCache()[icon][grey ? 1 : 0];
   if (!slot) {
-    slot = VORPixelImage_var::Adopt(QELZitBltRep::LoadIconImage(fileName));
+    slot = VORPixelImage_var::Adopt(QELZitBltRep::LoadIconImage(icon + VORUnicodeString(".bmp")));
     if (!slot)
       return nullptr;
     if (grey)
@@ -51,6 +53,13 @@ VORPixelImage* ButtonImage(const VORUnicodeString& fileName, bool grey) {
 }
 
 }  // namespace
+
+bool QELIsKeyword(const VORUnicodeString& text, std::string_view keyword) {
+  const std::u32string& points = text.CodePoints();
+  return points.size() == keyword.size() &&
+         std::equal(points.begin(), points.end(), keyword.begin(),
+                    [](char32_t a, char b) { return a == static_cast<unsigned char>(b); });
+}
 
 VORPixelImage* QELZitBltRep::LoadIconImage(const VORUnicodeString& fileName) {
   auto& cache = IconCache();
@@ -181,7 +190,7 @@ void QELZitBltRep::BuildRep(VORViewer* viewer) {
 void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
   if (!_btnBag)
     return;
-  VORPixelImage_var image(ButtonImage(_icon + VORUnicodeString(".bmp"), grey == 1));
+  VORPixelImage_var image(ButtonImage(_icon, grey == 1));
   if (!image)
     return;
   for (int i = _btnBag->GetSize(); i >= 1; --i)

@@ -1,6 +1,8 @@
 #include "VORBaseUnknown.h"
 
 #include <cstddef>
+#include <cstdint>
+#include <typeinfo>
 #include <string_view>
 #include <typeindex>
 #include <unordered_map>
@@ -29,13 +31,20 @@ struct CastKeyHash {
   }
 };
 
-void* CachedCast(VORBaseUnknown* object, const VORInterfaceId& iid) {
-  // The base interface answers the identity, which is no fixed offset for extensions.
-  if (iid.name == VORBaseUnknown::IID().name)
-    return iid.cast(object);
+// In front of the answers: the last answer per slot, found by the addresses of the type's
+// record and of the interface's name. Equal addresses mean an equal pair, so a hit needs no
+// name hashing or comparison (the answers compare names, as each library has its own records).
+struct RecentCast {
+  const std::type_info* type = nullptr;
+  const char* iid = nullptr;
+  std::size_t iidLength = 0;
+  std::ptrdiff_t offset = 0;
+};
+constexpr std::size_t kRecentCasts = 1024;  // a power of two
+
+std::ptrdiff_t AnswerOf(VORBaseUnknown* object, const VORInterfaceId& iid, const char* complete) {
   // Never destroyed: casts may run while statics of other libraries are torn down.
   static auto* answers = new std::unordered_map<CastKey, std::ptrdiff_t, CastKeyHash>();
-  auto* complete = static_cast<char*>(dynamic_cast<void*>(object));
   const CastKey key{std::type_index(typeid(*object)), iid.name};
   auto it = answers->find(key);
   if (it == answers->end()) {
@@ -43,7 +52,22 @@ void* CachedCast(VORBaseUnknown* object, const VORInterfaceId& iid) {
     const std::ptrdiff_t offset = seen ? static_cast<char*>(seen) - complete : kNoInterface;
     it = answers->emplace(key, offset).first;
   }
-  return it->second == kNoInterface ? nullptr : complete + it->second;
+  return it->second;
+}
+
+void* CachedCast(VORBaseUnknown* object, const VORInterfaceId& iid) {
+  // The base interface answers the identity, which is no fixed offset for extensions.
+  if (iid.name == VORBaseUnknown::IID().name)
+    return iid.cast(object);
+  static RecentCast recent[kRecentCasts];
+  auto* complete = static_cast<char*>(dynamic_cast<void*>(object));
+  const std::type_info* type = &typeid(*object);
+  const auto mix = reinterpret_cast<std::uintptr_t>(type) * 0x9E3779B97F4A7C15u ^
+                   reinterpret_cast<std::uintptr_t>(iid.name.data());
+  RecentCast& slot = recent[(mix >> 17) & (kRecentCasts - 1)];
+  if (slot.type != type || slot.iid != iid.name.data() || slot.iidLength != iid.name.size())
+    slot = RecentCast{type, iid.name.data(), iid.name.size(), AnswerOf(object, iid, complete)};
+  return slot.offset == kNoInterface ? nullptr : complete + slot.offset;
 }
 }  // namespace
 
