@@ -28,46 +28,41 @@ VORListValVORBaseUnknown_var Take(VORListValVORBaseUnknown_var* list) {
   }
   return result;
 }
+
+// The list that object answers through the interface's getter (empty when it has no such
+// interface).
+template <typename Var, typename Interface>
+VORListValVORBaseUnknown_var Ask(VORBaseUnknown* object,
+                                 HRESULT (Interface::*getter)(VORListValVORBaseUnknown_var*&,
+                                                              const char*),
+                                 const char* filter) {
+  Var answerer(object);
+  VORListValVORBaseUnknown_var* list = nullptr;
+  if (answerer)
+    (answerer.get()->*getter)(list, filter);
+  return Take(list);
+}
 }  // namespace
 
 VORListValVORBaseUnknown_var Previous(VORBaseUnknown* node) {
-  VORISPPFlowMgt_var flows(node);
-  VORListValVORBaseUnknown_var* list = nullptr;
-  if (flows)
-    flows->GetPreviousActivities(list, "Activity");
-  return Take(list);
+  return Ask<VORISPPFlowMgt_var>(node, &VORISPPFlowMgt::GetPreviousActivities, "Activity");
 }
 
 VORListValVORBaseUnknown_var Next(VORBaseUnknown* node) {
-  VORISPPFlowMgt_var flows(node);
-  VORListValVORBaseUnknown_var* list = nullptr;
-  if (flows)
-    flows->GetNextActivities(list, "Activity");
-  return Take(list);
+  return Ask<VORISPPFlowMgt_var>(node, &VORISPPFlowMgt::GetNextActivities, "Activity");
 }
 
 VORListValVORBaseUnknown_var Children(VORBaseUnknown* activity, const char* filter) {
-  VORISPPChildManagement_var children(activity);
-  VORListValVORBaseUnknown_var* list = nullptr;
-  if (children)
-    children->GetChildren(list, filter);
-  return Take(list);
+  return Ask<VORISPPChildManagement_var>(activity, &VORISPPChildManagement::GetChildren, filter);
 }
 
 VORListValVORBaseUnknown_var Resources(VORBaseUnknown* activity) {
-  VORISPPResourceManagement_var management(activity);
-  VORListValVORBaseUnknown_var* list = nullptr;
-  if (management)
-    management->GetResources(list, "Resource");
-  return Take(list);
+  return Ask<VORISPPResourceManagement_var>(activity, &VORISPPResourceManagement::GetResources,
+                                            "Resource");
 }
 
 VORListValVORBaseUnknown_var ChildProducts(VORBaseUnknown* product) {
-  VORIProduct_var p(product);
-  VORListValVORBaseUnknown_var* list = nullptr;
-  if (p)
-    p->GetChildren(list, "VORIProduct");
-  return Take(list);
+  return Ask<VORIProduct_var>(product, &VORIProduct::GetChildren, "VORIProduct");
 }
 
 VORBaseUnknown_var FatherActivity(VORBaseUnknown* activity) {

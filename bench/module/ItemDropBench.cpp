@@ -8,11 +8,9 @@
 #include <sstream>
 #include <string>
 
+#include "ChainLevel.h"
 #include "QELBaseScrollListZitBltRep.h"
 #include "QELIZitBltMgr.h"
-#include "VORDocument.h"
-#include "VORDriver.h"
-#include "VORModelDoor.h"
 #include "VORScript.h"
 #include "VORViewer.h"
 
@@ -20,36 +18,20 @@ namespace {
 
 constexpr int kSource = 5000;
 
-std::string Label(int i) {
-  return "S" + std::to_string(i);
-}
-
-// S0 -> S1 -> ... on one level, on the chart grid, each station taking its own part.
+// S0 -> S1 -> ..., each station taking its own part.
 std::string ChainFile(int n) {
-  const std::string file = "/tmp/pfv-item-drop-bench-" + std::to_string(n) + ".pprx";
-  VORProcess_var doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
-  VORModelDoor& door = doc->GetDoor();
-  VORBaseUnknown_var root = doc->GetRootProcess();
-  VORBaseUnknown_var previous;
-  for (int i = 0; i < n; ++i) {
-    VORBaseUnknown_var station, part, input;
-    door.CreateNode(root, "BIWActivityStation", station);
-    door.SetLabel(station, VORUnicodeString(Label(i)));
-    door.SetPertPosition(station, true, 12.5 + 50.0 * i, 12.5);
-    door.CreateProduct(doc->GetRootProduct(), VORUnicodeString("P" + std::to_string(i)), part);
-    door.AddProductIO(station, part, true, input);
-    door.AssignItem(station, part, input);
-    if (previous)
-      door.AddFlow(previous, station);
-    previous = station;
-  }
-  std::string error;
-  doc->SaveAs(file, error);
-  return file;
+  return SaveChainLevel(
+      "/tmp/pfv-item-drop-bench-" + std::to_string(n) + ".pprx", n,
+      [](VORModelDoor& door, VORProcess& doc, VORBaseUnknown_var& station, int i) {
+        VORBaseUnknown_var part, input;
+        door.CreateProduct(doc.GetRootProduct(), VORUnicodeString("P" + std::to_string(i)), part);
+        door.AddProductIO(station, part, true, input);
+        door.AssignItem(station, part, input);
+      });
 }
 
 QELBaseScrollListZitBltRep* InputList(VORDriver& driver, int station) {
-  QELIZitBltMgr_var manager{VORBaseUnknown_var(driver.FindObject(Label(station)))};
+  QELIZitBltMgr_var manager{VORBaseUnknown_var(driver.FindObject(StationLabel(station)))};
   QELZitBltRep* rep = nullptr;
   if (manager)
     manager->GetZitBlt("ProductInput", &rep);
@@ -65,15 +47,14 @@ bool Run(VORDriver& driver, const std::string& steps) {
 void BM_DropInputOnNextStation(benchmark::State& state) {
   const int n = static_cast<int>(state.range(0));
   VORDriver driver;
-  const std::string source = Label(kSource);
-  if (!driver.OpenDocument(ChainFile(n)) || !driver.PickObject("Line") ||
-      !driver.StartCommand("QELFpaProductFlowViewerCmd") ||
-      !Run(driver, "expand " + source + " ProductInput\nexpand " + Label(kSource + 1) +
+  const std::string source = StationLabel(kSource);
+  if (!OpenInViewer(driver, ChainFile(n)) ||
+      !Run(driver, "expand " + source + " ProductInput\nexpand " + StationLabel(kSource + 1) +
                        " ProductInput\n")) {
     state.SkipWithError(("cannot open the viewer: " + driver.LastError()).c_str());
     return;
   }
-  const VORMathPoint2D target{12.5 + 50.0 * (kSource + 1), 12.5};
+  const VORMathPoint2D target{StationX(kSource + 1), 12.5};
   for (auto _ : state) {
     state.PauseTiming();
     QELBaseScrollListZitBltRep* list = InputList(driver, kSource);

@@ -51,6 +51,20 @@ class GroupingTest : public ::testing::Test {
               S_OK);
     return r;
   }
+  // A hub plant type named name (of the component class when given), and a parent-child rule.
+  VORBaseUnknown_var PlanType(const char* name, const char* compclass = nullptr) {
+    VORBaseUnknown_var t;
+    EXPECT_EQ(Door().DefinePlanType(VORUnicodeString(name), t), S_OK);
+    Door().SetPlanTypeAttribute(t, VORUnicodeString("type"), VORUnicodeString("plantype_name"),
+                                VORUnicodeString(name));
+    if (compclass != nullptr)
+      Door().SetPlanTypeAttribute(t, VORUnicodeString(""), VORUnicodeString("compclass"),
+                                  VORUnicodeString(compclass));
+    return t;
+  }
+  void Child(const VORBaseUnknown_var& parent, const VORBaseUnknown_var& child) {
+    Door().AddPlanTypeRelation(parent, VORUnicodeString("lumoplantypechild"), child);
+  }
   // Saves the document built so far and opens it through the driver.
   void Open() {
     std::string error;

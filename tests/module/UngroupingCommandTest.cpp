@@ -50,13 +50,15 @@ TEST_F(UngroupingCommandTest, OnlyGroupingActivitiesCanBePicked) {
   driver.CancelCommand();
 }
 
-TEST_F(UngroupingCommandTest, AChainInsideAGroupComesBackBetweenItsNeighbours) {
+// X -> G -> Y: the chain, the resources and the one undo step of the whole change.
+TEST_F(UngroupingCommandTest, AChainComesBackBetweenItsNeighboursWithItsResourcesAsOneStep) {
   MakeGroup();
   auto x = Node(root, "X");
   auto y = Node(root, "Y");
   Flow(x, g);
   Flow(g, y);
   Open();
+  const std::string before = doc->SaveToString();
   Ungroup();
   EXPECT_EQ(Children(root), "X Y A B");
   EXPECT_EQ(Next(Find("X")), "A");
@@ -64,6 +66,18 @@ TEST_F(UngroupingCommandTest, AChainInsideAGroupComesBackBetweenItsNeighbours) {
   EXPECT_EQ(Next(ChildNamed(root, "B")), "Y");
   EXPECT_EQ(Find("G"), nullptr);
   EXPECT_TRUE(Messages().empty());
+  // The group's resources go back to the cell; the grouping resource disappears.
+  EXPECT_EQ(ChildProducts(Find("Cell")), "R1 R2");
+  EXPECT_EQ(Find("GR"), nullptr);
+  EXPECT_EQ(ResourceNames(ChildNamed(root, "A")), "R1");
+  EXPECT_EQ(ResourceNames(ChildNamed(root, "B")), "R2");
+
+  const std::string after = doc->SaveToString();
+  ASSERT_TRUE(driver.Undo()) << driver.LastError();
+  EXPECT_EQ(doc->SaveToString(), before) << "one ungrouping, one step";
+  EXPECT_EQ(Next(Find("X")), "G");
+  ASSERT_TRUE(driver.Redo()) << driver.LastError();
+  EXPECT_EQ(doc->SaveToString(), after);
 }
 
 TEST_F(UngroupingCommandTest, TwoPredecessorsBothLeadToTheFirstActivity) {
@@ -93,48 +107,10 @@ TEST_F(UngroupingCommandTest, WithoutPredecessorNothingOutsideIsLinked) {
   EXPECT_EQ(Previous(Find("Y")), "") << "the group's own link went with the group";
 }
 
-TEST_F(UngroupingCommandTest, TheGroupsResourcesGoBackAndTheGroupingResourceDisappears) {
-  MakeGroup();
-  auto x = Node(root, "X");
-  auto y = Node(root, "Y");
-  Flow(x, g);
-  Flow(g, y);
-  Open();
-  Ungroup();
-  EXPECT_EQ(ChildProducts(Find("Cell")), "R1 R2");
-  EXPECT_EQ(Find("GR"), nullptr);
-  EXPECT_EQ(ResourceNames(ChildNamed(root, "A")), "R1");
-  EXPECT_EQ(ResourceNames(ChildNamed(root, "B")), "R2");
-}
-
-TEST_F(UngroupingCommandTest, UndoRestoresTheGroupAndRedoDissolvesItAgain) {
-  MakeGroup();
-  auto x = Node(root, "X");
-  auto y = Node(root, "Y");
-  Flow(x, g);
-  Flow(g, y);
-  Open();
-  const std::string before = doc->SaveToString();
-  Ungroup();
-  const std::string after = doc->SaveToString();
-  ASSERT_TRUE(driver.Undo()) << driver.LastError();
-  EXPECT_EQ(doc->SaveToString(), before) << "one ungrouping, one step";
-  EXPECT_EQ(Next(Find("X")), "G");
-  ASSERT_TRUE(driver.Redo()) << driver.LastError();
-  EXPECT_EQ(doc->SaveToString(), after);
-}
-
 namespace {
 class HubUngroupingTest : public UngroupingCommandTest {
  protected:
   HubUngroupingTest() { hub = true; }
-  VORBaseUnknown_var PlanType(const char* name) {
-    VORBaseUnknown_var t;
-    EXPECT_EQ(Door().DefinePlanType(VORUnicodeString(name), t), S_OK);
-    Door().SetPlanTypeAttribute(t, VORUnicodeString("type"), VORUnicodeString("plantype_name"),
-                                VORUnicodeString(name));
-    return t;
-  }
 };
 }  // namespace
 
@@ -142,7 +118,7 @@ TEST_F(HubUngroupingTest, ResourcesThatTheParentCannotHoldRefuseTheUngroupingUnc
   auto cellType = PlanType("CellType");
   auto stationType = PlanType("StationType");
   PlanType("RobotType");
-  Door().AddPlanTypeRelation(cellType, VORUnicodeString("lumoplantypechild"), stationType);
+  Child(cellType, stationType);
   MakeGroup();
   auto x = Node(root, "X");
   Flow(x, g);
@@ -157,7 +133,7 @@ TEST_F(HubUngroupingTest, ResourcesThatTheParentCannotHoldRefuseTheUngroupingUnc
 TEST_F(HubUngroupingTest, ResourcesTheParentAllowsAreHandedBack) {
   auto cellType = PlanType("CellType");
   auto robotType = PlanType("RobotType");
-  Door().AddPlanTypeRelation(cellType, VORUnicodeString("lumoplantypechild"), robotType);
+  Child(cellType, robotType);
   MakeGroup();
   Open();
   Ungroup();

@@ -42,14 +42,8 @@ int QELEListZitBltItemDDPI::CheckReassignment(VORBaseUnknown* from, VORBaseUnkno
   }
   const std::unique_ptr<VORListValVORBaseUnknown_var> owned(assigned);
   const VORUnicodeString name = NameOf(item);
-  for (const VORBaseUnknown_var& other : *assigned) {
-    if (NameOf(other) == name) {
-      message = VORUnicodeString(kAlreadyAssigned);
-      return 0;
-    }
-  }
-  message = VORUnicodeString(kValid);
-  return 1;
+  return RefuseIfListed(
+      assigned, [&](const VORBaseUnknown_var& other) { return NameOf(other) == name; }, message);
 }
 
 HRESULT QELEListZitBltItemDDPI::Reassign(VORBaseUnknown* from, VORBaseUnknown* to) {

@@ -54,17 +54,13 @@ int QELEListZitBltItemDDPO::CheckReassignment(VORBaseUnknown* from, VORBaseUnkno
   const VORBaseUnknown_var item = ItemOf(output);
   VORISPPFlowMgt_var toFlow{VORBaseUnknown_var(to)};
   VORListValVORBaseUnknown_var* ios = nullptr;
-  if (toFlow && SUCCEEDED(toFlow->GetProductIOs(ios)) && ios != nullptr) {
-    const List owned(ios);
-    for (const VORBaseUnknown_var& io : *ios) {
-      if (item && ItemOf(io).Identity() == item.Identity()) {
-        message = VORUnicodeString(kAlreadyAssigned);
-        return 0;
-      }
-    }
-  }
-  message = VORUnicodeString(kValid);
-  return 1;
+  const List owned(toFlow && SUCCEEDED(toFlow->GetProductIOs(ios)) ? ios : nullptr);
+  return RefuseIfListed(
+      owned.get(),
+      [&](const VORBaseUnknown_var& io) {
+        return item && ItemOf(io).Identity() == item.Identity();
+      },
+      message);
 }
 
 HRESULT QELEListZitBltItemDDPO::Reassign(VORBaseUnknown* from, VORBaseUnknown* to) {

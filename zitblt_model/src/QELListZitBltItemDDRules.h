@@ -40,6 +40,22 @@ bool AcceptsInputOf(VORBaseUnknown* to, VORBaseUnknown* item);
 // to, or it would be counted twice. True when to accepts assembly.
 bool AcceptsAssembly(VORBaseUnknown* to, VORBaseUnknown* assembly);
 
+// The last rule of a check: refused as already assigned when an entry of list (null for none)
+// is the same as the dragged item, valid otherwise. Sets message; 1 when valid, 0 when refused.
+template <typename Same>
+int RefuseIfListed(VORListValVORBaseUnknown_var* list, Same same, VORUnicodeString& message) {
+  if (list != nullptr) {
+    for (const VORBaseUnknown_var& entry : *list) {
+      if (same(entry)) {
+        message = VORUnicodeString(kAlreadyAssigned);
+        return 0;
+      }
+    }
+  }
+  message = VORUnicodeString(kValid);
+  return 1;
+}
+
 // Keeps the changes made through the door of object's document while it lives apart: Commit
 // hands them to whoever records around it (the user's undo step); without Commit they are
 // undone, so a reassignment that fails half-way changes nothing.
