@@ -11,10 +11,6 @@
 
 namespace {
 
-VORProcess_var LoadText(const std::string& xml, std::string& error) {
-  return VORProcess_var::Adopt(VORProcess::LoadFromString(xml, "bad.pprx", error));
-}
-
 // Line 1 .. 12; the station A2 starts on line 6, column 7.
 const char* kDocument = R"(<?xml version="1.0" encoding="UTF-8"?>
 <pprDocument version="1">
@@ -29,12 +25,6 @@ const char* kDocument = R"(<?xml version="1.0" encoding="UTF-8"?>
   </process>
 </pprDocument>
 )";
-
-std::string Replace(std::string text, const std::string& from, const std::string& to) {
-  const auto at = text.find(from);
-  EXPECT_NE(at, std::string::npos) << from;
-  return at == std::string::npos ? text : text.replace(at, from.size(), to);
-}
 
 std::string ManyAttributes(int count) {
   std::string text = "<a>\n<b";
@@ -121,6 +111,31 @@ TEST(HostileStructureTest, RefusalsSayWhatIsWrongAndWhere) {
 </pprDocument>)";
   EXPECT_FALSE(LoadText(Replace(kDocument, "</pprDocument>", planning), error));
   EXPECT_NE(error.find("the bases of plan type 'T1' form a cycle"), std::string::npos) << error;
+}
+
+TEST(HostileXmlTest, BillionLaughsAndExternalEntitiesAreRefusedAtOnce) {
+  TempDir dir;
+  const std::string secret = dir.Write("secret.txt", "TOP-SECRET-CONTENT");
+  std::string laughs = "<?xml version=\"1.0\"?>\n<!DOCTYPE lolz [\n<!ENTITY lol \"lol\">\n";
+  for (int i = 1; i <= 9; ++i) {
+    laughs += "<!ENTITY lol" + std::to_string(i) + " \"";
+    for (int k = 0; k < 10; ++k)
+      laughs += i == 1 ? "&lol;" : "&lol" + std::to_string(i - 1) + ";";
+    laughs += "\">\n";
+  }
+  laughs += "]>\n<pprDocument version=\"1\">&lol9;</pprDocument>\n";
+  const std::string xxe = "<?xml version=\"1.0\"?>\n<!DOCTYPE d [<!ENTITY x SYSTEM \"file://" +
+                          secret + "\">]>\n<pprDocument version=\"1\">&x;</pprDocument>\n";
+  const std::string dtd =
+      "<?xml version=\"1.0\"?>\n<!DOCTYPE d SYSTEM \"http://127.0.0.1:9/x.dtd\">\n"
+      "<pprDocument version=\"1\"/>\n";
+  for (const std::string& text : {laughs, xxe, dtd}) {
+    std::string error;
+    VORProcess_var doc = LoadText(text, error);
+    EXPECT_FALSE(doc);
+    EXPECT_NE(error.find("bad.pprx:"), std::string::npos) << error;
+    EXPECT_EQ(error.find("TOP-SECRET"), std::string::npos);
+  }
 }
 
 TEST(StaleTemporaryFileTest, OpeningADocumentRemovesWhatKilledSavesLeftBeside) {

@@ -33,6 +33,18 @@ inline std::string Ids(VORListValVORBaseUnknown_var* list) {
   return text;
 }
 
+// The document read from xml, named "bad.pprx" in its messages (null with error when refused).
+inline VORProcess_var LoadText(const std::string& xml, std::string& error) {
+  return VORProcess_var::Adopt(VORProcess::LoadFromString(xml, "bad.pprx", error));
+}
+
+// text with the first from replaced by to (a failure when from is missing).
+inline std::string Replace(std::string text, const std::string& from, const std::string& to) {
+  const auto at = text.find(from);
+  EXPECT_NE(at, std::string::npos) << from;
+  return at == std::string::npos ? text : text.replace(at, from.size(), to);
+}
+
 // Records the activity notifications of a root process: "kind father son" per line.
 class ActivityRecorder {
  public:

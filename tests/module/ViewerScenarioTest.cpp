@@ -593,19 +593,8 @@ TEST(ViewerScriptTest, OpeningOrganisingAndSwitchingLevelsAsAScript) {
   const std::string document = dir.Path() + "/line.pprx";
   ASSERT_EQ(SaveSampleLine(document), "");
   ::setenv("SCENARIO_DOC", document.c_str(), 1);
-  std::string output;
-  FILE* pipe = ::popen(PFV_BINARY " script " VIEWER_DATA "/viewer_story.pfvs 2>&1", "r");
-  ASSERT_NE(pipe, nullptr);
-  char buffer[4096];
-  for (size_t n; (n = std::fread(buffer, 1, sizeof buffer, pipe)) > 0;)
-    output.append(buffer, n);
-  const int status = ::pclose(pipe);
-  for (size_t at = output.find(document); at != std::string::npos; at = output.find(document))
-    output.replace(at, document.size(), "${SCENARIO_DOC}");
-  std::string expected, error;
-  ASSERT_TRUE(VORReadFile(VIEWER_DATA "/viewer_story.expected", expected, error)) << error;
-  EXPECT_EQ(output, expected);
-  EXPECT_EQ(status, 0);
+  ExpectScriptPrints(PFV_BINARY, VIEWER_DATA "/viewer_story.pfvs",
+                     VIEWER_DATA "/viewer_story.expected", {{document, "SCENARIO_DOC"}});
 }
 
 // --- Invariants over generated levels ---------------------------------------------------------

@@ -113,6 +113,13 @@ class ZitBltManagerTest : public ::testing::Test {
       rep->GetPoDPosition(p.x, p.y);
     return p;
   }
+  // A change of father's children (about the loading) broadcast on the root, as the model does.
+  void Dispatch(VORBaseUnknown* father, SPPModifyKind kind) {
+    auto n = VORHandle<VORSPPActivityNotification>::Adopt(
+        new VORSPPActivityNotification(father, loading, kind));
+    VORISPPActivityModificationEvents_var(root)->GetEventPublisher()->Dispatch(
+        VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(), n);
+  }
   static void Move(const VORBaseUnknown_var& node, double x, double y) {
     QELIPertNode_var(node)->SetPosition(x, y);
   }
@@ -286,22 +293,16 @@ TEST_F(ZitBltManagerTest, SubscriberPassesOnlyItsOwnActivitysChangesUnlessMuted)
   Manager(grouping)->BuildZitBltReps(viewer);
   Manager(station)->BuildZitBltReps(viewer);
   log->clear();
-  VOREventPublisher* publisher = VORISPPActivityModificationEvents_var(root)->GetEventPublisher();
-  auto dispatch = [&](VORBaseUnknown* father, SPPModifyKind kind) {
-    auto n = VORHandle<VORSPPActivityNotification>::Adopt(
-        new VORSPPActivityNotification(father, loading, kind));
-    publisher->Dispatch(VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(), n);
-  };
-  dispatch(station, SPPResourceAssigned);  // a kind the base command does not handle
+  Dispatch(station, SPPResourceAssigned);  // a kind the base command does not handle
   EXPECT_TRUE(log->empty());
-  dispatch(station, SPPItemAssigned);  // the station's one command refreshes it and its parents
+  Dispatch(station, SPPItemAssigned);  // the station's one command refreshes it and its parents
   EXPECT_EQ(*log, (std::vector<std::string>{
                       "S/BIWStationStatusBars/none", "G/BIWStationStatusBars/none",
                       "G/BIWGroupingStatusBars/none", "G/BIWStationStatusBars/none"}));
   log->clear();
   QELIZitBltCBSubscriber_var subscriber(station);
   subscriber->SetCallbacksSuspended(true);
-  dispatch(station, SPPItemAssigned);
+  Dispatch(station, SPPItemAssigned);
   EXPECT_TRUE(log->empty());
   subscriber->SetCallbacksSuspended(false);
   QELBaseListZitBltCmd* command = nullptr;
@@ -313,16 +314,10 @@ TEST_F(ZitBltManagerTest, UnassignmentsRefreshTwiceAndADeletedOwnerEndsItsComman
   Manager(grouping)->BuildZitBltReps(viewer);
   Manager(station)->BuildZitBltReps(viewer);
   log->clear();
-  VOREventPublisher* publisher = VORISPPActivityModificationEvents_var(root)->GetEventPublisher();
-  auto dispatch = [&](VORBaseUnknown* father, SPPModifyKind kind) {
-    auto n = VORHandle<VORSPPActivityNotification>::Adopt(
-        new VORSPPActivityNotification(father, loading, kind));
-    publisher->Dispatch(VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(), n);
-  };
   const std::vector<std::string> once = {
       "S/BIWStationStatusBars/none", "G/BIWStationStatusBars/none", "G/BIWGroupingStatusBars/none",
       "G/BIWStationStatusBars/none"};
-  dispatch(station, SPPItemUnassigned);
+  Dispatch(station, SPPItemUnassigned);
   std::vector<std::string> twice = once;
   twice.insert(twice.end(), once.begin(), once.end());
   EXPECT_EQ(*log, twice);
@@ -353,19 +348,13 @@ TEST_F(ZitBltManagerTest, AnAssemblyUpdateRefreshesWhileMutedAndLeavesTheFlagCle
   Manager(grouping)->BuildZitBltReps(viewer);
   Manager(station)->BuildZitBltReps(viewer);
   log->clear();
-  VOREventPublisher* publisher = VORISPPActivityModificationEvents_var(root)->GetEventPublisher();
-  auto dispatch = [&](VORBaseUnknown* father, SPPModifyKind kind) {
-    auto n = VORHandle<VORSPPActivityNotification>::Adopt(
-        new VORSPPActivityNotification(father, loading, kind));
-    publisher->Dispatch(VORSPPActivityNotificationDispatcher::DISPATCHER_SPP_VIEWS_CHANGE(), n);
-  };
   QELIZitBltCBSubscriber_var subscriber(station);
   QELIUpdateManufAssly_var update(root);
   subscriber->SetCallbacksSuspended(true);
   update->SetUpdateInProgress(true);
   // Only the loading's change: no command cares, yet the station's subscriber heard of another
   // activity during the update and leaves the flag cleared.
-  dispatch(loading, SPPItemAssigned);
+  Dispatch(loading, SPPItemAssigned);
   EXPECT_TRUE(log->empty());
   EXPECT_FALSE(subscriber->AreCallbacksSuspended());
   // Its own change refreshes, and the flag it found is put back.
@@ -382,7 +371,7 @@ TEST_F(ZitBltManagerTest, AnAssemblyUpdateRefreshesWhileMutedAndLeavesTheFlagCle
   // Without an update, muted means muted.
   update->SetUpdateInProgress(false);
   log->clear();
-  dispatch(station, SPPItemAssigned);
+  Dispatch(station, SPPItemAssigned);
   EXPECT_TRUE(log->empty());
   subscriber->SetCallbacksSuspended(false);
 }

@@ -253,17 +253,9 @@ TEST_F(ZitBltVisibilityCmdTest, TheChosenVisibilitySurvivesASaveAndANewOpening) 
   ::setenv("SCENARIO_DOC", file.c_str(), 1);
   const std::string saved = startup.Path().string() + "/saved.pprx";
   ::setenv("SCENARIO_SAVED", saved.c_str(), 1);
-  int status = 0;
-  std::string output =
-      RunProgram(PFV_BINARY " script " VIEWER_DATA "/zitblt_visibility.pfvs 2>&1", status);
-  for (const std::string& path : {saved, file}) {
-    for (size_t at = output.find(path); at != std::string::npos; at = output.find(path))
-      output.replace(at, path.size(), path == saved ? "${SCENARIO_SAVED}" : "${SCENARIO_DOC}");
-  }
-  std::string expected, error;
-  ASSERT_TRUE(VORReadFile(VIEWER_DATA "/zitblt_visibility.expected", expected, error)) << error;
-  EXPECT_EQ(output, expected);
-  EXPECT_EQ(status, 0);
+  ExpectScriptPrints(PFV_BINARY, VIEWER_DATA "/zitblt_visibility.pfvs",
+                     VIEWER_DATA "/zitblt_visibility.expected",
+                     {{saved, "SCENARIO_SAVED"}, {file, "SCENARIO_DOC"}});
 }
 
 }  // namespace

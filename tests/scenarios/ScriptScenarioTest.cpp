@@ -11,32 +11,20 @@
 #include "TempDir.h"
 #include "VORFileIO.h"
 
-namespace {
-
-void ReplaceAll(std::string& text, const std::string& from, const std::string& to) {
-  for (size_t at = text.find(from); at != std::string::npos; at = text.find(from, at + to.size()))
-    text.replace(at, from.size(), to);
-}
-}  // namespace
-
 TEST(ScriptScenarioTest, ThePickCopyStoryAsAScriptPrintsWhatAPlannerChecks) {
   TempDir dir;
   const std::string document = dir.Path() + "/line.pprx";
   ASSERT_EQ(SaveSampleLine(document), "");
   ::setenv("SCENARIO_DOC", document.c_str(), 1);
   ::setenv("SCENARIO_DATA", SCENARIO_DATA, 1);
-  int status = 0;
-  std::string output = RunProgram(
-      std::string(PFV_BINARY) + " script " SCENARIO_DATA "/pick_and_copy.pfvs 2>&1", status);
-  ReplaceAll(output, document, "${SCENARIO_DOC}");
-  ReplaceAll(output, SCENARIO_DATA, "${SCENARIO_DATA}");
-  std::string expected, error;
-  ASSERT_TRUE(VORReadFile(SCENARIO_DATA "/pick_and_copy.expected", expected, error)) << error;
-  EXPECT_EQ(output, expected);
-  EXPECT_EQ(status, 0);
+  ExpectScriptPrints(PFV_BINARY, SCENARIO_DATA "/pick_and_copy.pfvs",
+                     SCENARIO_DATA "/pick_and_copy.expected",
+                     {{document, "SCENARIO_DOC"}, {SCENARIO_DATA, "SCENARIO_DATA"}});
 
   const std::string bad = dir.Write("bad.pfvs", "open ${SCENARIO_DOC}\nstart NoSuchCommand\n");
-  output = RunProgram(std::string(PFV_BINARY) + " script " + bad + " 2>&1", status);
+  int status = 0;
+  const std::string output =
+      RunProgram(std::string(PFV_BINARY) + " script " + bad + " 2>&1", status);
   EXPECT_NE(output.find("line 2: error: unknown command \"NoSuchCommand\""), std::string::npos)
       << output;
   EXPECT_NE(status, 0);
@@ -47,15 +35,10 @@ TEST(ScriptScenarioTest, DraggingListLinesOfTheSampleLineMovesWhatIsAllowedAndUn
   const char* examples = std::getenv("PFV_EXAMPLES");
   ASSERT_NE(examples, nullptr) << "ctest gives the examples folder";
   ::setenv("SCENARIO_OUT", dir.Path().c_str(), 1);
-  int status = 0;
-  std::string output =
-      RunProgram(std::string(PFV_BINARY) + " script " SCENARIO_DATA "/drag_item.pfvs 2>&1", status);
-  ReplaceAll(output, examples, "${PFV_EXAMPLES}");
-  ReplaceAll(output, dir.Path(), "${SCENARIO_OUT}");
-  std::string expected, error;
-  ASSERT_TRUE(VORReadFile(SCENARIO_DATA "/drag_item.expected", expected, error)) << error;
-  EXPECT_EQ(output, expected);
-  EXPECT_EQ(status, 0);
+  ExpectScriptPrints(PFV_BINARY, SCENARIO_DATA "/drag_item.pfvs",
+                     SCENARIO_DATA "/drag_item.expected",
+                     {{examples, "PFV_EXAMPLES"}, {dir.Path(), "SCENARIO_OUT"}});
+  std::string error;
   // The undone document is the one the planner started from, byte for byte.
   std::string before, undone;
   ASSERT_TRUE(VORReadFile(dir.Path() + "/before.pprx", before, error)) << error;
