@@ -13,6 +13,7 @@
 #include "VORFrmLayout.h"
 #include "VORModelDoor.h"
 #include "VORModelGenerator.h"
+#include "ViewerTestSupport.h"
 
 namespace {
 
@@ -22,28 +23,16 @@ struct Reach {
   int zitBltElements = 0;  // what the viewer shows besides the chart
 };
 
-QELFpaProductFlowViewer* FindViewer() {
-  for (VORFrmWindow* w : VORFrmLayout::GetCurrentLayout()->GetWindowList()) {
-    if (w->IsAKindOf(QELFpaProductFlowViewer::ClassName()))
-      return static_cast<QELFpaProductFlowViewer*>(w);
-  }
-  return nullptr;
-}
-
 // Opens the viewer on a generated level and counts the callbacks that one drag of station "S20"
 // (inside its lane, with a cross flow in and out) and one assignment to it reach.
 Reach Measure(int stations) {
   Reach reach;
   TempDir dir;
   const std::string file = dir.Path() + "/level.pprx";
-  std::string error;
   auto generated =
       VORProcess_var::Adopt(VORModelGenerator::GenerateFlatLevel(stations, true, "Line"));
-  EXPECT_TRUE(generated->SaveAs(file, error)) << error;
   VORDriver driver;
-  EXPECT_TRUE(driver.OpenDocument(file) && driver.PickObject("Line") &&
-              driver.StartCommand("QELFpaProductFlowViewerCmd"))
-      << driver.LastError();
+  OpenInViewer(driver, generated, file);
   QELFpaProductFlowViewer* viewer = FindViewer();
   if (viewer == nullptr)
     return reach;

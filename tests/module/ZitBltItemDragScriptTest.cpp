@@ -5,12 +5,11 @@
 // hides.
 #include <gtest/gtest.h>
 
-#include <sstream>
-
 #include "QELBaseScrollListZitBltRep.h"
 #include "QELIZitBltMgr.h"
 #include "QELScrollListDrop.h"
 #include "TempDir.h"
+#include "ViewerTestSupport.h"
 #include "VORDocument.h"
 #include "VORDriver.h"
 #include "VORExtISelectShow.h"
@@ -19,7 +18,6 @@
 #include "VORISPPProductIO.h"
 #include "VORIVisProperties.h"
 #include "VORModelDoor.h"
-#include "VORScript.h"
 #include "VORViewer.h"
 
 namespace {
@@ -34,12 +32,9 @@ class ZitBltItemDragScriptTest : public ::testing::Test {
     auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
     VORModelDoor& door = doc->GetDoor();
     VORBaseUnknown_var root = doc->GetRootProcess();
-    auto node = [&](VORBaseUnknown* father, const char* label, const char* type, double x,
-                    double y) {
-      VORBaseUnknown_var n;
-      door.CreateNode(father, type, n, 0, label);
-      door.SetLabel(n, VORUnicodeString(label));
-      door.SetPertPosition(n, true, x, y);
+    auto node = [&](VORBaseUnknown* father, const char* label, const char* type, double x) {
+      VORBaseUnknown_var n = AddActivity(door, father, label, type);
+      door.SetPertPosition(n, true, x, 12.5);
       return n;
     };
     auto product = [&](const char* name) {
@@ -53,13 +48,13 @@ class ZitBltItemDragScriptTest : public ::testing::Test {
       if (input)
         door.AssignItem(activity, item, p);
     };
-    VORBaseUnknown_var g = node(root, "G", "BIWActivityGrouping", 12.5, 12.5);
-    VORBaseUnknown_var s1 = node(g, "S1", "BIWActivityStation", 12.5, 12.5);
-    VORBaseUnknown_var s2 = node(g, "S2", "BIWActivityStation", 62.5, 12.5);
+    VORBaseUnknown_var g = node(root, "G", "BIWActivityGrouping", 12.5);
+    VORBaseUnknown_var s1 = node(g, "S1", "BIWActivityStation", 12.5);
+    VORBaseUnknown_var s2 = node(g, "S2", "BIWActivityStation", 62.5);
     door.AddFlow(s1, s2);
-    VORBaseUnknown_var s3 = node(root, "S3", "BIWActivityStation", 212.5, 12.5);
-    VORBaseUnknown_var s4 = node(root, "S4", "BIWActivityStation", 312.5, 12.5);
-    VORBaseUnknown_var l = node(root, "L", "BIWActivityLoading", 412.5, 12.5);
+    VORBaseUnknown_var s3 = node(root, "S3", "BIWActivityStation", 212.5);
+    VORBaseUnknown_var s4 = node(root, "S4", "BIWActivityStation", 312.5);
+    node(root, "L", "BIWActivityLoading", 412.5);
     door.AddFlow(g, s3);
     door.AddFlow(s3, s4);
     io(g, product("Sub"), false);
@@ -72,34 +67,15 @@ class ZitBltItemDragScriptTest : public ::testing::Test {
     VORBaseUnknown_var robot = product("R1");
     door.MakeResource(robot, "Robot", "");
     door.AssignResource(s3, robot);
-    std::string error;
-    file = dir.Path() + "/line.pprx";
-    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
-    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
-    ASSERT_TRUE(driver.PickObject("Line") && driver.StartCommand("QELFpaProductFlowViewerCmd"))
-        << driver.LastError();
-    driver.TakeEvents();
+    OpenInViewer(driver, doc, dir.Path() + "/line.pprx");
   }
-  // Runs the steps; the output of the last step only.
-  std::string Run(const std::string& steps, bool ok = true) {
-    std::ostringstream out;
-    VORScript script(driver, out);
-    EXPECT_EQ(script.Run(steps), ok) << out.str();
-    const std::string text = "\n" + out.str();
-    const size_t last = text.rfind("\n> ");
-    return text.substr(text.find('\n', last + 1) + 1);
-  }
+  std::string Run(const std::string& steps, bool ok = true) { return RunSteps(driver, steps, ok); }
   std::string Saved() { return driver.GetDocument()->SaveToString(); }
   QELBaseScrollListZitBltRep* List(const char* node, const char* name) {
-    QELIZitBltMgr_var manager{VORBaseUnknown_var(driver.FindObject(node))};
-    QELZitBltRep* rep = nullptr;
-    if (manager)
-      manager->GetZitBlt(name, &rep);
-    return rep != nullptr ? rep->GetScrollListRep() : nullptr;
+    return ScrollList(driver, node, name);
   }
 
   TempDir dir;
-  std::string file;
   VORDriver driver;
 };
 

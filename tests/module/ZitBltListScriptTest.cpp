@@ -8,13 +8,13 @@
 #include "QELBaseScrollListZitBltRep.h"
 #include "QELIZitBltMgr.h"
 #include "TempDir.h"
+#include "ViewerTestSupport.h"
 #include "VORDocument.h"
 #include "QELIPertNode.h"
 #include "VORDriver.h"
 #include "VORExtIVisu.h"
 #include "VORManipulator.h"
 #include "VORModelDoor.h"
-#include "VORScript.h"
 #include "ZitBltTestSupport.h"
 
 namespace {
@@ -34,40 +34,17 @@ class ZitBltListScriptTest : public ::testing::Test {
         "</ActivityZitBlt></Config>");
     auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
     VORModelDoor& door = doc->GetDoor();
-    VORBaseUnknown_var s, t;
-    door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", s, 0, "S");
-    door.SetLabel(s, VORUnicodeString("S"));
-    door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", t, 0, "T");
-    door.SetLabel(t, VORUnicodeString("T"));
-    door.AddFlow(s, t);
+    VORBaseUnknown_var s = AddActivity(door, doc->GetRootProcess(), "S");
+    door.AddFlow(s, AddActivity(door, doc->GetRootProcess(), "T"));
     for (int i = 1; i <= 7; ++i) {
       VORBaseUnknown_var part, io;
       door.CreateProduct(doc->GetRootProduct(), VORUnicodeString("P" + std::to_string(i)), part);
       door.AddProductIO(s, part, true, io);
     }
-    std::string error;
-    const std::string file = dir.Path() + "/line.pprx";
-    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
-    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
-    ASSERT_TRUE(driver.PickObject("Line") && driver.StartCommand("QELFpaProductFlowViewerCmd"))
-        << driver.LastError();
-    driver.TakeEvents();
+    OpenInViewer(driver, doc, dir.Path() + "/line.pprx");
   }
-  // Runs the steps; the output of the last step only.
-  std::string Run(const std::string& steps, bool ok = true) {
-    std::ostringstream out;
-    VORScript script(driver, out);
-    EXPECT_EQ(script.Run(steps), ok) << out.str();
-    const std::string text = "\n" + out.str();
-    const size_t last = text.rfind("\n> ");
-    return text.substr(text.find('\n', last + 1) + 1);
-  }
-  QELBaseScrollListZitBltRep* List() {
-    QELIZitBltMgr_var manager{VORBaseUnknown_var(driver.FindObject("S"))};
-    QELZitBltRep* rep = nullptr;
-    manager->GetZitBlt("ProductInput", &rep);
-    return rep != nullptr ? rep->GetScrollListRep() : nullptr;
-  }
+  std::string Run(const std::string& steps, bool ok = true) { return RunSteps(driver, steps, ok); }
+  QELBaseScrollListZitBltRep* List() { return ScrollList(driver, "S", "ProductInput"); }
 
   ZitBltStartupDir startup;
   TempDir dir;

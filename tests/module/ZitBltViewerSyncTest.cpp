@@ -17,6 +17,7 @@
 #include "VORModelDoor.h"
 #include "VORModuleLoader.h"
 #include "VORScript.h"
+#include "ViewerTestSupport.h"
 #include "ZitBltTestSupport.h"
 
 namespace {
@@ -32,34 +33,17 @@ class ZitBltViewerSyncTest : public ::testing::Test {
     auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
     VORBaseUnknown_var root = doc->GetRootProcess();
     VORModelDoor& door = doc->GetDoor();
-    VORBaseUnknown_var a, b, g, s1;
-    door.CreateNode(root, "BIWActivityStation", a);
-    door.SetLabel(a, VORUnicodeString("A"));
-    door.CreateNode(root, "BIWActivityStation", b);
-    door.SetLabel(b, VORUnicodeString("B"));
-    door.AddFlow(a, b);
-    door.CreateNode(root, "BIWActivityGrouping", g);
-    door.SetLabel(g, VORUnicodeString("G"));
-    door.CreateNode(g, "BIWActivityStation", s1);
-    door.SetLabel(s1, VORUnicodeString("S1"));
-    std::string error;
-    const std::string file = dir.Path() + "/line.pprx";
-    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
-    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
-    ASSERT_TRUE(OpenViewerOn("Line")) << driver.LastError();
+    VORBaseUnknown_var a = AddActivity(door, root, "A");
+    door.AddFlow(a, AddActivity(door, root, "B"));
+    AddActivity(door, AddActivity(door, root, "G", "BIWActivityGrouping"), "S1");
+    OpenInViewer(driver, doc, dir.Path() + "/line.pprx");
   }
   void TearDown() override { driver.GetEditor() ? (void)driver.CloseWindow(Title()) : (void)0; }
 
   bool OpenViewerOn(const char* label) {
     return driver.PickObject(label) && driver.StartCommand("QELFpaProductFlowViewerCmd");
   }
-  QELFpaProductFlowViewer* Viewer() const {
-    for (VORFrmWindow* w : VORFrmLayout::GetCurrentLayout()->GetWindowList()) {
-      if (w->IsAKindOf(QELFpaProductFlowViewer::ClassName()))
-        return static_cast<QELFpaProductFlowViewer*>(w);
-    }
-    return nullptr;
-  }
+  static QELFpaProductFlowViewer* Viewer() { return FindViewer(); }
   std::string Title() const { return Viewer() ? Viewer()->GetName().str() : std::string(); }
   VORBaseUnknown_var Object(const char* label) const {
     return VORBaseUnknown_var(driver.FindObject(label));
@@ -213,21 +197,14 @@ class ZitBltViewerRefreshTest : public ::testing::Test {
         "</ActivityZitBlt></Config>");
     auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
     VORModelDoor& door = doc->GetDoor();
-    VORBaseUnknown_var s, other, part, assembly;
-    door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", s, 0, "S");
-    door.SetLabel(s, VORUnicodeString("S"));
-    door.CreateNode(doc->GetRootProcess(), "BIWActivityStation", other, 0, "T");
-    door.SetLabel(other, VORUnicodeString("T"));
+    VORBaseUnknown_var s = AddActivity(door, doc->GetRootProcess(), "S");
+    AddActivity(door, doc->GetRootProcess(), "T");
+    VORBaseUnknown_var part, assembly;
     door.CreateProduct(doc->GetRootProduct(), "Floor", part, "P1");
     door.AssignItem(s, part);
     door.CreateMfgAssembly("Floor assembly", assembly, "M1");
     door.AssignItem(s, assembly);
-    std::string error;
-    const std::string file = dir.Path() + "/line.pprx";
-    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
-    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
-    ASSERT_TRUE(driver.PickObject("Line") && driver.StartCommand("QELFpaProductFlowViewerCmd"))
-        << driver.LastError();
+    OpenInViewer(driver, doc, dir.Path() + "/line.pprx");
     log = reinterpret_cast<std::vector<std::string>* (*)()>(
         VORModuleLoader::FindSymbol("QELZitBltTestCmds", "QELTestListZitBltLog"))();
     log->clear();

@@ -16,6 +16,7 @@
 #include "VORIZitBltVisibility.h"
 #include "VORModelDoor.h"
 #include "VORViewer.h"
+#include "ViewerTestSupport.h"
 #include "ZitBltTestSupport.h"
 
 namespace {
@@ -43,23 +44,13 @@ class ZitBltVisibilityCmdTest : public ::testing::Test {
     startup.WriteConfig(Config());
     auto doc = VORProcess_var::Adopt(VORProcess::CreateNew("Line"));
     VORModelDoor& door = doc->GetDoor();
-    VORBaseUnknown_var node;
-    for (auto [label, type] : {std::pair{"S1", "BIWActivityStation"},
-                               {"S2", "BIWActivityStation"},
-                               {"L", "BIWActivityLoading"},
-                               {"G", "BIWActivityGrouping"}}) {
-      door.CreateNode(doc->GetRootProcess(), type, node);
-      door.SetLabel(node, VORUnicodeString(label));
-    }
-    VORBaseUnknown_var inner;  // inside the collapsed grouping: no ZitBlts built by the viewer
-    door.CreateNode(node, "BIWActivityStation", inner);
-    door.SetLabel(inner, VORUnicodeString("S3"));
-    std::string error;
+    for (const char* label : {"S1", "S2"})
+      AddActivity(door, doc->GetRootProcess(), label);
+    AddActivity(door, doc->GetRootProcess(), "L", "BIWActivityLoading");
+    // Inside the collapsed grouping: no ZitBlts built by the viewer.
+    AddActivity(door, AddActivity(door, doc->GetRootProcess(), "G", "BIWActivityGrouping"), "S3");
     file = startup.Path().string() + "/line.pprx";
-    ASSERT_TRUE(doc->SaveAs(file, error)) << error;
-    ASSERT_TRUE(driver.OpenDocument(file)) << driver.LastError();
-    ASSERT_TRUE(driver.PickObject("Line") && driver.StartCommand("QELFpaProductFlowViewerCmd"))
-        << driver.LastError();
+    OpenInViewer(driver, doc, file);
   }
 
   // Selects the activities (the first one first) and starts the command.
