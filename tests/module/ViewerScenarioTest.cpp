@@ -312,31 +312,6 @@ TEST_F(ViewerTest, ThreeIndependentNodesSpreadOverTheSquareInOneColumn) {
   EXPECT_EQ(Position("R"), (Point{Snap(0.0), y2}));
 }
 
-TEST_F(ViewerTest, WithinALevelTheOrderFollowsThePreviousLevelNotTheChildList) {
-  // Children in the order X, A, Y, B with A -> Y and B -> X.
-  auto x = Node(root, "X");
-  auto a = Node(root, "A");
-  auto y = Node(root, "Y");
-  auto b = Node(root, "B");
-  Flow(a, y);
-  Flow(b, x);
-  Open();
-  ASSERT_TRUE(OpenViewerOn("Line"));
-  QELPFVNodeOrganiser* organiser = nullptr;
-  EXPECT_TRUE(Arrange(organiser));
-  const VORListPtrVORListValVORBaseUnknown_var& lists = *organiser->GetLevelLists();
-  ASSERT_EQ(lists.Size(), 2);
-  ASSERT_EQ(lists[1]->Size(), 2);
-  ASSERT_EQ(lists[2]->Size(), 2);
-  EXPECT_EQ((*lists[1])[1].Identity(), Find("A"));
-  EXPECT_EQ((*lists[1])[2].Identity(), Find("B"));
-  EXPECT_EQ((*lists[2])[1].Identity(), Find("Y"));
-  EXPECT_EQ((*lists[2])[2].Identity(), Find("X"));
-  organiser->RequestDelayedDestruction();
-  EXPECT_LT(Position("A").y, Position("B").y);
-  EXPECT_LT(Position("Y").y, Position("X").y);
-}
-
 TEST_F(ViewerTest, UnequalBranchesThatMeetAgainAreReportedAtTheMeetingNodeAndNothingMoves) {
   auto a = Node(root, "A");
   auto b = Node(root, "B");

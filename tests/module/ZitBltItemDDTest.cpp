@@ -244,19 +244,9 @@ TEST_F(ZitBltItemDDTest, AnOutputDroppedOnASubActivityAsksWhichItemItReplaces) {
   EXPECT_EQ(dialog->FindControl("Select Item To Replace")->GetTitle(),
             VORUnicodeString("Select Item To Replace"));
 
-  // Cancel and the close button leave the model alone.
-  ASSERT_TRUE(dialog->UserPressCancel());
-  VORDeferredDeletion::Drain();
-  EXPECT_EQ(OptionsDialog(), nullptr);
-  ASSERT_EQ(Drop(out, line.group, line.s1), S_FALSE);
-  ASSERT_TRUE(OptionsDialog()->UserCloseWindow());
-  VORDeferredDeletion::Drain();
-  EXPECT_EQ(line.doc->SaveToString(), before);
-  EXPECT_FALSE(line.doc->GetUndoHistory().CanUndo());
-
+  // (Cancel and the close button are answered in the item drag script tests.)
   // OK: the chosen input carries the output's item, with its assignment.
-  ASSERT_EQ(Drop(out, line.group, line.s1), S_FALSE);
-  ASSERT_TRUE(OptionsDialog()->UserPressOK());
+  ASSERT_TRUE(dialog->UserPressOK());
   VORDeferredDeletion::Drain();
   EXPECT_EQ(OptionsDialog(), nullptr);
   EXPECT_EQ(Inputs(line.s1), Strings{"Sub"});

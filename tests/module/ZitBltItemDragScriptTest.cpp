@@ -119,21 +119,6 @@ TEST_F(ZitBltItemDragScriptTest, AnInputMovesBothListsShowItAndUndoRestoresThemE
   EXPECT_EQ(Run("print list S4 ProductInput\n"), s4);
 }
 
-TEST_F(ZitBltItemDragScriptTest, AnOutputAndAResourceGoToOtherActivities) {
-  Run("expand S3 ProductOutput\nexpand S4 ProductInput\nexpand S3 Resource\n");
-  EXPECT_EQ(Run("drag-item S3 ProductOutput Beam S4\n"), "drop on \"S4\": allowed\n");
-  EXPECT_NE(Run("print list S4 ProductInput\n").find("\"Beam\": kind 2, state 1"),
-            std::string::npos);
-  EXPECT_EQ(Run("drag-item S3 Resource R1 L\n"), "drop on \"L\": allowed\n");
-  EXPECT_NE(Run("print list S3 Resource\n").find("0 items"), std::string::npos);
-  Run("expand L Resource\n");
-  EXPECT_NE(Run("print list L Resource\n").find("item 1 \"R1\""), std::string::npos);
-  // Each drop is one step.
-  Run("undo\n");
-  EXPECT_NE(Run("print list S3 Resource\n").find("item 1 \"R1\""), std::string::npos);
-  EXPECT_NE(Run("print list S4 ProductInput\n").find("\"Beam\""), std::string::npos);
-}
-
 TEST_F(ZitBltItemDragScriptTest, TheItemOptionsDialogIsAnsweredInAScript) {
   // G's output handed to its own station S1, as a drop inside the open group does it.
   VORBaseUnknown* g = driver.FindObject("G");
