@@ -91,31 +91,31 @@ class GroupingTest : public ::testing::Test {
       n->GetLabel(label);
     return label.ConvertToUTF8();
   }
-  static std::string Labels(VORListValVORBaseUnknown_var* list) {
+  // The labels (or, for products, part numbers) of what object lists through Var's getter.
+  template <typename Var, typename Interface>
+  static std::string Listed(VORBaseUnknown* object,
+                            HRESULT (Interface::*getter)(VORListValVORBaseUnknown_var*&,
+                                                         const char*),
+                            const char* filter, std::string (*name)(VORBaseUnknown*) = Label) {
+    VORListValVORBaseUnknown_var* list = nullptr;
+    (Var(object).get()->*getter)(list, filter);
     std::string text;
-    if (list != nullptr) {
-      for (const VORBaseUnknown_var& o : *list)
-        text += (text.empty() ? "" : " ") + Label(o);
-    }
+    for (int i = 1; list != nullptr && i <= list->Size(); ++i)
+      text += (text.empty() ? "" : " ") + name((*list)[i]);
     delete list;
     return text;
   }
   // Every child of an activity, control nodes too, in order.
   static std::string Children(VORBaseUnknown* activity) {
-    VORListValVORBaseUnknown_var* list = nullptr;
-    VORISPPChildManagement_var(activity)->GetChildren(list);
-    return Labels(list);
+    return Listed<VORISPPChildManagement_var>(activity, &VORISPPChildManagement::GetChildren,
+                                              nullptr);
   }
-  // Next nodes of node, control nodes too.
+  // Next and previous nodes of node, control nodes too.
   static std::string Next(VORBaseUnknown* node) {
-    VORListValVORBaseUnknown_var* list = nullptr;
-    VORISPPFlowMgt_var(node)->GetNextActivities(list, "");
-    return Labels(list);
+    return Listed<VORISPPFlowMgt_var>(node, &VORISPPFlowMgt::GetNextActivities, "");
   }
   static std::string Previous(VORBaseUnknown* node) {
-    VORListValVORBaseUnknown_var* list = nullptr;
-    VORISPPFlowMgt_var(node)->GetPreviousActivities(list, "");
-    return Labels(list);
+    return Listed<VORISPPFlowMgt_var>(node, &VORISPPFlowMgt::GetPreviousActivities, "");
   }
   static std::string ProductName(VORBaseUnknown* product) {
     VORUnicodeString name;
@@ -124,22 +124,11 @@ class GroupingTest : public ::testing::Test {
     return name.ConvertToUTF8();
   }
   static std::string ChildProducts(VORBaseUnknown* product) {
-    VORListValVORBaseUnknown_var* list = nullptr;
-    VORIProduct_var(product)->GetChildren(list);
-    std::string text;
-    for (const VORBaseUnknown_var& p : *list)
-      text += (text.empty() ? "" : " ") + ProductName(p);
-    delete list;
-    return text;
+    return Listed<VORIProduct_var>(product, &VORIProduct::GetChildren, "VORIProduct", ProductName);
   }
   static std::string ResourceNames(VORBaseUnknown* activity) {
-    VORListValVORBaseUnknown_var* list = nullptr;
-    VORISPPResourceManagement_var(activity)->GetResources(list);
-    std::string text;
-    for (const VORBaseUnknown_var& p : *list)
-      text += (text.empty() ? "" : " ") + ProductName(p);
-    delete list;
-    return text;
+    return Listed<VORISPPResourceManagement_var>(activity, &VORISPPResourceManagement::GetResources,
+                                                 "Resource", ProductName);
   }
   // The child of an activity with that label (null when none).
   static VORBaseUnknown_var ChildNamed(VORBaseUnknown* activity, const std::string& label) {

@@ -102,6 +102,14 @@ class ViewerTest : public ::testing::Test {
     VORIGraphNodeLayout_var(Find(label))->GetPertPosition(p.x, p.y);
     return p;
   }
+  // Places the new nodes of the viewer's level with a fresh organiser.
+  bool PositionNew(VORListValVORBaseUnknown_var& nodes) {
+    auto* organiser = new QELPFVNodeOrganiser();
+    VORListValVORBaseUnknown_var* list = &nodes;
+    const bool placed = organiser->PositionNewNode(root, list, Viewer()->GetPertController());
+    organiser->RequestDelayedDestruction();
+    return placed;
+  }
   // Runs an organiser on the viewer's level.
   bool Arrange(QELPFVNodeOrganiser*& organiser) {
     organiser = new QELPFVNodeOrganiser();
@@ -411,12 +419,9 @@ TEST_F(ViewerTest, ANewNodeLandsWhereAFullLayoutPutsItWithEverythingDownstream) 
   VORBaseUnknown_var added(n);
   Viewer()->GetPertController()->AddChildNode(added);
 
-  auto* newNodes = new VORListValVORBaseUnknown_var;
-  newNodes->Append(n);
-  auto* organiser = new QELPFVNodeOrganiser();
-  EXPECT_TRUE(organiser->PositionNewNode(root, newNodes, Viewer()->GetPertController()));
-  organiser->RequestDelayedDestruction();
-  delete newNodes;
+  VORListValVORBaseUnknown_var newNodes;
+  newNodes.Append(n);
+  EXPECT_TRUE(PositionNew(newNodes));
   // Levels: A 0, B and N 1, C 2; side 100, two rows on level 1 (25, 75), one on level 2.
   // N's columns start one step right of A's position; B keeps its place, C moves with N.
   const double x1 = before[0].x + 50.0;
@@ -436,17 +441,12 @@ TEST_F(ViewerTest, PositionNewNodeWithNothingNewOrAStrangerMovesNothing) {
   ASSERT_TRUE(OpenViewerOn("Line"));
   const Point pa = Position("A");
   const Point pb = Position("B");
-  auto* list = new VORListValVORBaseUnknown_var;
-  auto* organiser = new QELPFVNodeOrganiser();
-  EXPECT_TRUE(organiser->PositionNewNode(root, list, Viewer()->GetPertController()));
-  organiser->RequestDelayedDestruction();
+  VORListValVORBaseUnknown_var list;
+  EXPECT_TRUE(PositionNew(list));
   VORBaseUnknown_var stranger;
   ASSERT_EQ(doc->GetDoor().CreateNode(Find("A"), "BIWActivityStation", stranger), S_OK);
-  list->Append(stranger);
-  organiser = new QELPFVNodeOrganiser();
-  EXPECT_TRUE(organiser->PositionNewNode(root, list, Viewer()->GetPertController()));
-  organiser->RequestDelayedDestruction();
-  delete list;
+  list.Append(stranger);
+  EXPECT_TRUE(PositionNew(list));
   EXPECT_EQ(Position("A"), pa);
   EXPECT_EQ(Position("B"), pb);
 }

@@ -113,6 +113,12 @@ class ZitBltManagerTest : public ::testing::Test {
       rep->GetPoDPosition(p.x, p.y);
     return p;
   }
+  // The grouping's and the station's ZitBlts, with the log of their builds forgotten.
+  void BuildGroupingAndStation() {
+    Manager(grouping)->BuildZitBltReps(viewer);
+    Manager(station)->BuildZitBltReps(viewer);
+    log->clear();
+  }
   // A change of father's children (about the loading) broadcast on the root, as the model does.
   void Dispatch(VORBaseUnknown* father, SPPModifyKind kind) {
     auto n = VORHandle<VORSPPActivityNotification>::Adopt(
@@ -283,9 +289,7 @@ TEST_F(ZitBltManagerTest, StatusBarRefreshClimbsToTheParentOnlyWithAnUpdateComma
 }
 
 TEST_F(ZitBltManagerTest, SubscriberPassesOnlyItsOwnActivitysChangesUnlessMuted) {
-  Manager(grouping)->BuildZitBltReps(viewer);
-  Manager(station)->BuildZitBltReps(viewer);
-  log->clear();
+  BuildGroupingAndStation();
   Dispatch(station, SPPResourceAssigned);  // a kind the base command does not handle
   EXPECT_TRUE(log->empty());
   Dispatch(station, SPPItemAssigned);  // the station's one command refreshes it and its parents
@@ -304,9 +308,7 @@ TEST_F(ZitBltManagerTest, SubscriberPassesOnlyItsOwnActivitysChangesUnlessMuted)
 }
 
 TEST_F(ZitBltManagerTest, UnassignmentsRefreshTwiceAndADeletedOwnerEndsItsCommands) {
-  Manager(grouping)->BuildZitBltReps(viewer);
-  Manager(station)->BuildZitBltReps(viewer);
-  log->clear();
+  BuildGroupingAndStation();
   const std::vector<std::string> once = {
       "S/BIWStationStatusBars/none", "G/BIWStationStatusBars/none", "G/BIWGroupingStatusBars/none",
       "G/BIWStationStatusBars/none"};
@@ -338,9 +340,7 @@ TEST_F(ZitBltManagerTest, UnassignmentsRefreshTwiceAndADeletedOwnerEndsItsComman
 }
 
 TEST_F(ZitBltManagerTest, AnAssemblyUpdateRefreshesWhileMutedAndLeavesTheFlagClearedElsewhere) {
-  Manager(grouping)->BuildZitBltReps(viewer);
-  Manager(station)->BuildZitBltReps(viewer);
-  log->clear();
+  BuildGroupingAndStation();
   QELIZitBltCBSubscriber_var subscriber(station);
   QELIUpdateManufAssly_var update(root);
   subscriber->SetCallbacksSuspended(true);

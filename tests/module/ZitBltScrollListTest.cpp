@@ -81,14 +81,23 @@ class ScrollListTest : public ::testing::Test {
   std::vector<VORBaseUnknown_var> items;
 };
 
-TEST_F(ScrollListTest, AListThatFitsItsRangeShowsEverythingWithoutAScroller) {
-  QELBaseScrollListZitBltRep* rep = Make("lefttop", 5);
-  EXPECT_EQ(rep->GetItemVisualCount(), 5);
-  EXPECT_EQ(rep->GetFirst(), 1);
-  EXPECT_EQ(rep->GetScroller(), nullptr);
-  for (int i = 1; i <= 5; ++i) {
-    EXPECT_TRUE(LabelShown(rep, i) && LinkShown(rep, i)) << i;
-    EXPECT_EQ(Label(rep, i), VORMathPoint2D(-17.0, 2.5 * i - 2.0)) << i;
+// A list that fits its range, and one whose scroll bar is hidden after a scroll, show every item
+// at its resting place from the first, without a scroller.
+TEST_F(ScrollListTest, WithoutAScrollerEveryItemShowsFromTheFirst) {
+  QELBaseScrollListZitBltRep* fits = Make("lefttop", 5);
+  EXPECT_EQ(fits->GetItemVisualCount(), 5);
+  QELBaseScrollListZitBltRep* hidden = Make("lefttop", 7);
+  ScrollTo(hidden, 3.0);
+  hidden->SetZitbltScrollBarHideState(1);
+  EXPECT_EQ(hidden->GetScrollTrack(), nullptr);
+  EXPECT_EQ(hidden->GetItemVisualCount(), 7);
+  for (QELBaseScrollListZitBltRep* rep : {fits, hidden}) {
+    EXPECT_EQ(rep->GetFirst(), 1);
+    EXPECT_EQ(rep->GetScroller(), nullptr);
+    for (int i = 1; i <= rep->GetItemVisualCount(); ++i) {
+      EXPECT_TRUE(LabelShown(rep, i) && LinkShown(rep, i)) << i;
+      EXPECT_EQ(Label(rep, i), VORMathPoint2D(-17.0, 2.5 * i - 2.0)) << i;
+    }
   }
 }
 
@@ -147,19 +156,6 @@ TEST_F(ScrollListTest, TheScrollerSnapsBackBelowOneAndPastTheLastWindow) {
   EXPECT_TRUE(LabelShown(rep, 6));
   ScrollTo(rep, 1e30);  // no overflow on absurd positions
   EXPECT_EQ(rep->GetFirst(), 3);
-}
-
-TEST_F(ScrollListTest, AHiddenScrollBarShowsEveryItemFromTheFirst) {
-  QELBaseScrollListZitBltRep* rep = Make("lefttop", 7);
-  ScrollTo(rep, 3.0);
-  rep->SetZitbltScrollBarHideState(1);
-  EXPECT_EQ(rep->GetFirst(), 1);
-  EXPECT_EQ(rep->GetScroller(), nullptr);
-  EXPECT_EQ(rep->GetScrollTrack(), nullptr);
-  for (int i = 1; i <= 7; ++i) {
-    EXPECT_TRUE(LabelShown(rep, i) && LinkShown(rep, i)) << i;
-    EXPECT_EQ(Label(rep, i), VORMathPoint2D(-17.0, 2.5 * i - 2.0)) << i;
-  }
 }
 
 TEST_F(ScrollListTest, MiddleListsShowTheirRangeButOfferNoScroller) {
