@@ -71,6 +71,16 @@ class ViewerTest : public ::testing::Test {
   void Flow(const VORBaseUnknown_var& from, const VORBaseUnknown_var& to) {
     EXPECT_EQ(doc->GetDoor().AddFlow(from, to), S_OK);
   }
+  // Activities labelled labels under root, each flowing into the next.
+  void Chain(std::initializer_list<const char*> labels) {
+    VORBaseUnknown_var previous;
+    for (const char* label : labels) {
+      VORBaseUnknown_var node = Node(root, label);
+      if (previous)
+        Flow(previous, node);
+      previous = node;
+    }
+  }
   // Saves the document built so far and opens it; the driver's document replaces doc.
   void Open(const std::string& name = "line.pprx") {
     std::string error;
@@ -285,11 +295,7 @@ TEST_F(ViewerTest, TheTitleNamesFileAndLevelPathAndShortensToTheWindowWidth) {
 // --- The organiser: levels, order, positions and cycles --------------------------------------
 
 TEST_F(ViewerTest, AChainTakesOneColumnPerLevelAndIndependentNodesShareOne) {
-  auto a = Node(root, "A");
-  auto b = Node(root, "B");
-  auto c = Node(root, "C");
-  Flow(a, b);
-  Flow(b, c);
+  Chain({"A", "B", "C"});
   Open();
   ASSERT_TRUE(OpenViewerOn("Line"));
   // Levels 0, 1, 2: square side 100, 50 between columns, y = 50; snapped as it goes.
@@ -364,9 +370,7 @@ TEST_F(ViewerTest, ATrueCycleNamesTheFirstNodeMetAgainAndTheWarningCanBeSilenced
 }
 
 TEST_F(ViewerTest, EveryMoveIsAnnouncedOnTheChartRoot) {
-  auto a = Node(root, "A");
-  auto b = Node(root, "B");
-  Flow(a, b);
+  Chain({"A", "B"});
   Open();
   ASSERT_TRUE(OpenViewerOn("Line"));
   std::vector<std::string> moved;
@@ -402,11 +406,7 @@ TEST_F(ViewerTest, BadArgumentsAreRefusedAndEmptyLevelsAreNoError) {
 // --- PositionNewNode ------------------------------------------------------------------------
 
 TEST_F(ViewerTest, ANewNodeLandsWhereAFullLayoutPutsItWithEverythingDownstream) {
-  auto a = Node(root, "A");
-  auto b = Node(root, "B");
-  auto c = Node(root, "C");
-  Flow(a, b);
-  Flow(b, c);
+  Chain({"A", "B", "C"});
   Open();
   ASSERT_TRUE(OpenViewerOn("Line"));
   const Point before[] = {Position("A"), Position("B"), Position("C")};
@@ -434,9 +434,7 @@ TEST_F(ViewerTest, ANewNodeLandsWhereAFullLayoutPutsItWithEverythingDownstream) 
 }
 
 TEST_F(ViewerTest, PositionNewNodeWithNothingNewOrAStrangerMovesNothing) {
-  auto a = Node(root, "A");
-  auto b = Node(root, "B");
-  Flow(a, b);
+  Chain({"A", "B"});
   Open();
   ASSERT_TRUE(OpenViewerOn("Line"));
   const Point pa = Position("A");

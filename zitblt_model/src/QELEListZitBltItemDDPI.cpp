@@ -11,13 +11,9 @@ using namespace QELItemDD;
 
 int QELEListZitBltItemDDPI::CheckReassignment(VORBaseUnknown* from, VORBaseUnknown* to,
                                               VORUnicodeString& message) {
-  if (!IsActivity(from) || !IsActivity(to)) {
-    message = VORUnicodeString(kNotAnActivity);
-    return 0;
-  }
   VORUnicodeString fromType;
   VORUnicodeString toType;
-  if (!TypeNameOf(from, fromType) || !TypeNameOf(to, toType))
+  if (!ReadActivityTypes(from, to, fromType, toType, message))
     return 0;
   const VORBaseUnknown_var item = ItemOf(GetExtendedObject());
   if (IsStationOrGrouping(fromType) && !AcceptsInputOf(to, item)) {

@@ -28,13 +28,9 @@ bool Contains(VORListValVORBaseUnknown_var* list, VORBaseUnknown* object) {
 
 int QELEListZitBltItemDDPO::CheckReassignment(VORBaseUnknown* from, VORBaseUnknown* to,
                                               VORUnicodeString& message) {
-  if (!IsActivity(from) || !IsActivity(to)) {
-    message = VORUnicodeString(kNotAnActivity);
-    return 0;
-  }
   VORUnicodeString fromType;
   VORUnicodeString toType;
-  if (!TypeNameOf(from, fromType) || !TypeNameOf(to, toType))
+  if (!ReadActivityTypes(from, to, fromType, toType, message))
     return 0;
   if (!IsStationOrGrouping(fromType) || !IsStationGroupingOrLoading(toType)) {
     message = TypeRefusal(fromType, toType);

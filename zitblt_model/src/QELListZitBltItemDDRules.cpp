@@ -30,6 +30,15 @@ bool TypeNameOf(VORBaseUnknown* object, VORUnicodeString& type) {
   return spec && SUCCEEDED(spec->GetTypeName(type));
 }
 
+bool ReadActivityTypes(VORBaseUnknown* from, VORBaseUnknown* to, VORUnicodeString& fromType,
+                       VORUnicodeString& toType, VORUnicodeString& message) {
+  if (!IsActivity(from) || !IsActivity(to)) {
+    message = VORUnicodeString(kNotAnActivity);
+    return false;
+  }
+  return TypeNameOf(from, fromType) && TypeNameOf(to, toType);
+}
+
 bool IsStationOrGrouping(const VORUnicodeString& type) {
   return type == VORUnicodeString(VORModelLateTypes::Station) ||
          type == VORUnicodeString(VORModelLateTypes::Grouping);

@@ -23,6 +23,10 @@ VORUnicodeString TypeRefusal(const VORUnicodeString& fromType, const VORUnicodeS
 bool IsActivity(VORBaseUnknown* object);
 // The late type name through the object's feature; false when it has none.
 bool TypeNameOf(VORBaseUnknown* object, VORUnicodeString& type);
+// The opening rule of every item check: both ends are activities (else message is the
+// refusal) whose type names are read into fromType and toType. False when either fails.
+bool ReadActivityTypes(VORBaseUnknown* from, VORBaseUnknown* to, VORUnicodeString& fromType,
+                       VORUnicodeString& toType, VORUnicodeString& message);
 bool IsStationOrGrouping(const VORUnicodeString& type);
 bool IsStationGroupingOrLoading(const VORUnicodeString& type);
 bool IsWelding(const VORUnicodeString& type);
