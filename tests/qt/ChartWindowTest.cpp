@@ -22,11 +22,6 @@
 
 namespace {
 
-std::string SamplePath() {
-  const char* dir = std::getenv("PFV_EXAMPLES");
-  return std::string(dir ? dir : "examples") + "/underbody.pprx";
-}
-
 struct Place {
   bool has = false;
   double x = 0.0;
@@ -47,21 +42,7 @@ class ChartWindowTest : public ::testing::Test {
     QApplication::processEvents();
   }
 
-  // Opens the sample and the Product Flow Viewer on the line, as from the menu and the tree.
-  VORQtViewerWidget* OpenViewer() {
-    EXPECT_TRUE(window->OpenDocument(QString::fromStdString(SamplePath())));
-    QAction* open = window->CommandAction("QELFpaProductFlowViewerCmd");
-    if (open == nullptr)
-      return nullptr;
-    open->trigger();
-    const auto items = window->Tree()->findItems("Underbody line", Qt::MatchRecursive);
-    if (items.size() != 1)
-      return nullptr;
-    QTest::mouseClick(window->Tree()->viewport(), Qt::LeftButton, Qt::NoModifier,
-                      window->Tree()->visualItemRect(items.front()).center());
-    QApplication::processEvents();  // the fit once the window has its size
-    return window->CurrentViewerWidget();
-  }
+  VORQtViewerWidget* OpenViewer() { return OpenSampleInViewer(*window); }
 
   std::map<VORBaseUnknown*, Place> Places(const char* level) {
     std::map<VORBaseUnknown*, Place> places;
@@ -95,7 +76,8 @@ class ChartWindowTest : public ::testing::Test {
 
 TEST_F(ChartWindowTest, ANewChartIsFittedToItsWindowWithLabelsReadable) {
   VORQtViewerWidget* widget = OpenViewer();
-  ASSERT_NE(widget, nullptr);
+  ASSERT_NE(widget, nullptr) << "the viewer window is in the MDI area";
+  EXPECT_TRUE(window->MdiArea()->activeSubWindow()->windowTitle().contains("Product Flow Viewer"));
   VORViewer* viewer = widget->GetViewer();
   const VORBox2D scene = viewer->GetSceneBox();
   const QPointF a = widget->ModelToPixel(scene.xmin, scene.ymax);

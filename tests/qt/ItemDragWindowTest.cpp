@@ -29,15 +29,7 @@ class ItemDragWindowTest : public ::testing::Test {
     window->resize(1400, 880);
     window->show();
     QApplication::processEvents();
-    const char* dir = std::getenv("PFV_EXAMPLES");
-    ASSERT_TRUE(window->OpenDocument(QString(dir ? dir : "examples") + "/underbody.pprx"));
-    window->CommandAction("QELFpaProductFlowViewerCmd")->trigger();
-    const auto items = window->Tree()->findItems("Underbody line", Qt::MatchRecursive);
-    ASSERT_EQ(items.size(), 1);
-    QTest::mouseClick(window->Tree()->viewport(), Qt::LeftButton, Qt::NoModifier,
-                      window->Tree()->visualItemRect(items.front()).center());
-    QApplication::processEvents();
-    widget = window->CurrentViewerWidget();
+    widget = OpenSampleInViewer(*window);
     ASSERT_NE(widget, nullptr);
   }
   void TearDown() override {

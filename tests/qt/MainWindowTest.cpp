@@ -13,8 +13,6 @@
 #include <cmath>
 #include <memory>
 
-#include "QELPertController.h"
-#include "QELPertViewer.h"
 #include "QtTestHelpers.h"
 #include "TempDir.h"
 #include "VOR2DBagRep.h"
@@ -64,11 +62,6 @@ class PickTestCommand : public VORStateCommand {
  private:
   VORPathElementAgent_var _agent;
 };
-
-std::string SamplePath() {
-  const char* dir = std::getenv("PFV_EXAMPLES");
-  return std::string(dir ? dir : "examples") + "/underbody.pprx";
-}
 
 class MainWindowTest : public ::testing::Test {
  protected:
@@ -342,43 +335,6 @@ TEST_F(MainWindowTest, ClosingAnMdiWindowDeletesTheFrameWindow) {
   window->AfterStep();
   EXPECT_EQ(window->Driver().FindWindow("Chart"), nullptr);
   EXPECT_TRUE(window->MdiArea()->subWindowList().isEmpty());
-}
-
-TEST_F(MainWindowTest, TheProductFlowViewerOpensFromTheMenuOnATreePickAndItsNodesDrag) {
-  ASSERT_TRUE(window->OpenDocument(QString::fromStdString(SamplePath())));
-  QAction* open = window->CommandAction("QELFpaProductFlowViewerCmd");
-  ASSERT_NE(open, nullptr) << "listed from the workbench file";
-  open->trigger();
-  ASSERT_NE(window->Driver().GetRunningCommand(), nullptr)
-      << VORQtString(window->Driver().LastError()).toStdString();
-  const auto items = window->Tree()->findItems("Underbody line", Qt::MatchRecursive);
-  ASSERT_EQ(items.size(), 1);
-  QTest::mouseClick(window->Tree()->viewport(), Qt::LeftButton, Qt::NoModifier,
-                    window->Tree()->visualItemRect(items.front()).center());
-  VORQtViewerWidget* widget = window->CurrentViewerWidget();
-  ASSERT_NE(widget, nullptr) << "the viewer window is in the MDI area";
-  auto* pert = dynamic_cast<QELPertViewer*>(widget->GetViewer());
-  ASSERT_NE(pert, nullptr);
-  ASSERT_NE(pert->GetController(), nullptr);
-  EXPECT_GT(pert->GetController()->GetNodeCount(), 20);
-  EXPECT_TRUE(window->MdiArea()->activeSubWindow()->windowTitle().contains("Product Flow Viewer"));
-
-  VORBaseUnknown* node = window->Driver().FindObject("FF010 Front floor");
-  ASSERT_NE(node, nullptr);
-  double x0 = 0.0, y0 = 0.0;
-  VORIGraphNodeLayout_var(node)->GetPertPosition(x0, y0);
-  const QPoint from = widget->ModelToPixel(x0, y0).toPoint();
-  EXPECT_EQ(pert->NodeAt(from.x(), from.y()).get(), node) << "the painted node is where it is";
-  const int cells = static_cast<int>(std::ceil(
-      2.0 * 25.0 * widget->GetViewer()->GetMain2DViewpoint()->GetScale()));  // two grid cells
-  QTest::mousePress(widget, Qt::LeftButton, Qt::NoModifier, from);
-  for (int step = 1; step <= 5; ++step)
-    QTest::mouseMove(widget, from + QPoint(0, cells * step / 5));
-  QTest::mouseRelease(widget, Qt::LeftButton, Qt::NoModifier, from + QPoint(0, cells));
-  double x1 = 0.0, y1 = 0.0;
-  VORIGraphNodeLayout_var(node)->GetPertPosition(x1, y1);
-  EXPECT_NEAR(x1, x0, 1e-6);
-  EXPECT_LT(y1, y0 - 25.0) << "dragged down by about two grid cells";
 }
 
 TEST_F(MainWindowTest, SavingAsKeepsTheFileAndAFailureSaysWhy) {

@@ -21,11 +21,6 @@
 
 namespace {
 
-std::string SamplePath() {
-  const char* dir = std::getenv("PFV_EXAMPLES");
-  return std::string(dir ? dir : "examples") + "/underbody.pprx";
-}
-
 QCheckBox* BoxTitled(const QList<QCheckBox*>& boxes, const QString& title) {
   for (QCheckBox* box : boxes) {
     if (box->text() == title)
@@ -42,10 +37,7 @@ TEST(ZitBltDialogWindowTest, TheMenuCommandOpensCheckBoxesThatHideZitBltsAtOnce)
   window->show();
   ASSERT_TRUE(window->OpenDocument(QString::fromStdString(SamplePath())));
   const char* station = "FF010 Front floor";
-  const auto items = window->Tree()->findItems(station, Qt::MatchRecursive);
-  ASSERT_EQ(items.size(), 1);
-  QTest::mouseClick(window->Tree()->viewport(), Qt::LeftButton, Qt::NoModifier,
-                    window->Tree()->visualItemRect(items.front()).center());
+  ASSERT_TRUE(ClickTreeItem(*window, station));
   QAction* action = window->CommandAction("QELFpaCtxZitBltCmd");
   ASSERT_NE(action, nullptr) << "listed from the workbench file";
   ASSERT_TRUE(action->isEnabled()) << "the module is installed";
