@@ -122,6 +122,27 @@ TEST_F(ZitBltListScriptTest, PickItemSelectsItAndItRidesOnTheItemManipulator) {
   EXPECT_EQ(List()->GetItemManipulator()->GetElementCount(), 0);
 }
 
+TEST_F(ZitBltListScriptTest, AListMakesItsManipulatorsAndSelectionWatchOnlyWhenNeeded) {
+  QELIZitBltMgr_var manager{VORBaseUnknown_var(driver.FindObject("T"))};
+  QELZitBltRep* empty = nullptr;
+  ASSERT_EQ(manager->GetZitBlt("Empty", &empty), S_OK);
+  QELBaseScrollListZitBltRep* bare = empty->GetScrollListRep();
+  EXPECT_FALSE(bare->HasScrollManipulator() || bare->HasItemManipulator());
+  EXPECT_FALSE(bare->IsWatchingSelection()) << "nothing of an empty list can be picked";
+
+  // Seven items drawn in a range of five: the scroll bar, and the watch of its item reps.
+  QELBaseScrollListZitBltRep* list = List();
+  EXPECT_TRUE(list->HasScrollManipulator());
+  EXPECT_TRUE(list->IsWatchingSelection());
+  EXPECT_FALSE(list->HasItemManipulator());
+  Run("expand S ProductInput\npick-item S ProductInput P2\n");
+  ASSERT_TRUE(list->HasItemManipulator()) << "made when the pick reached the list";
+  EXPECT_EQ(list->GetItemManipulator()->GetElementCount(), 1);
+  EXPECT_EQ(Run("print list T Empty\n"),
+            "list \"Empty\" of \"T\": 0 items, range 5, first 1, scroll bar none, grey\n");
+  EXPECT_FALSE(bare->HasScrollManipulator() || bare->HasItemManipulator());
+}
+
 TEST_F(ZitBltListScriptTest, SlidingTheButtonDownTheLeftEdgeTurnsTheListDownwards) {
   Run("expand S ProductInput\nslide S ProductInput 0 -12\n");
   EXPECT_EQ(List()->GetLocation(), VORUnicodeString("leftbottom"));

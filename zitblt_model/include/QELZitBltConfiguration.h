@@ -21,6 +21,10 @@ struct QELZitBltDefinition {
   bool hasUpdateData = false;     // an "UpdateData" element was there (only the first is read)
   VORUnicodeString updateCmdName;     // its "CmdName": update command class and header id
   VORUnicodeString updateLoadModule;  // its "LoadModule"
+  // The module factories of the rep and of the update command, found on first use
+  // (QELZitBltCommandFactory): a cached definition serves every activity of its type.
+  mutable VORBaseUnknown* (*repFactory)(VORBaseUnknown*) = nullptr;
+  mutable VORBaseUnknown* (*updateFactory)(VORBaseUnknown*) = nullptr;
 };
 
 namespace QELZitBltConfiguration {

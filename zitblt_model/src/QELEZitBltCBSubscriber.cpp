@@ -5,8 +5,8 @@
 #include "QELBaseListZitBltCmd.h"
 #include "QELIUpdateManufAssly.h"
 #include "QELIZitBltMgr.h"
+#include "QELZitBltCommandFactory.h"
 #include "QELZitBltConfiguration.h"
-#include "VORCommandHeader.h"
 #include "VORDeferredDeletion.h"
 #include "VORISPPActivity.h"
 #include "VORISPPActivityModificationEvents.h"
@@ -15,10 +15,6 @@
 
 namespace {
 bool callbacksSuspended = false;
-
-VORString Narrow(const VORUnicodeString& s) {
-  return VORString(s.ConvertToUTF8().c_str());
-}
 
 // The subscribers listening on one root publisher. Their callbacks are filed under their own
 // activity, so a change under one activity reaches its subscriber only. A subscriber that hears
@@ -131,10 +127,7 @@ void QELEZitBltCBSubscriber::CreateUpdateCommands() {
        QELZitBltConfiguration::DefinitionsForActivity(document, activity)) {
     if (!d.hasUpdateData)
       continue;
-    auto header = VORCommandHeader_var::Adopt(
-        new VORCommandHeader(Narrow(d.updateCmdName), Narrow(d.updateLoadModule),
-                             Narrow(d.updateCmdName), activity, VORCommandHeader::Available));
-    VORCommand* created = header->CreateCommand();
+    VORCommand* created = QELZitBltCommandFactory::CreateUpdateCommand(d, activity);
     auto* command = dynamic_cast<QELBaseListZitBltCmd*>(created);
     if (command == nullptr) {
       VORCommandDeletion(created);

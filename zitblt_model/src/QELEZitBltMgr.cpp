@@ -4,9 +4,9 @@
 #include "QELIPertNode.h"
 #include "QELIZitBltCBSubscriber.h"
 #include "QELPertNotifications.h"
+#include "QELZitBltCommandFactory.h"
 #include "QELZitBltConfiguration.h"
 #include "QELZitBltRep.h"
-#include "VORCommandHeader.h"
 #include "VORDeferredDeletion.h"
 #include "VORIModelEvents.h"
 #include "VORISPPActivity.h"
@@ -15,10 +15,6 @@
 #include "VORModify.h"
 
 namespace {
-VORString Narrow(const VORUnicodeString& s) {
-  return VORString(s.ConvertToUTF8().c_str());
-}
-
 // The names whose refresh climbs to the parent activity's status bars.
 bool IsStatusBar(const VORUnicodeString& name) {
   for (const char* bar : {"BIWStationStatusBars", "BIWPointFasteningStatusBars",
@@ -74,10 +70,7 @@ void QELEZitBltMgr::BuildZitBlts() {
     return;
   for (const QELZitBltDefinition& d :
        QELZitBltConfiguration::DefinitionsForActivity(document, activity)) {
-    auto header = VORCommandHeader_var::Adopt(
-        new VORCommandHeader(Narrow(d.name), Narrow(d.loadModule), Narrow(d.type), activity,
-                             VORCommandHeader::Available));
-    VORCommand* created = header->CreateCommand();
+    VORCommand* created = QELZitBltCommandFactory::CreateRep(d, activity);
     auto* rep = dynamic_cast<QELZitBltRep*>(created);
     if (rep == nullptr) {
       VORCommandDeletion(created);  // not a ZitBlt (or nothing): skipped

@@ -116,8 +116,15 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   QELIScrollListZitBltItemVisu* GetItemVisual(int position) const;
   VOR2DLineRep* GetScroller() const { return _scroller.get(); }
   VOR2DPolygonRep* GetScrollTrack() const { return _track.get(); }
-  VOR2DManipulator* GetScrollManipulator() const { return _scrollManipulator; }
-  VOR2DManipulator* GetItemManipulator() const { return _itemManipulator; }
+  // The scroller's and the selected items' manipulators, made with their callbacks on first
+  // call: a list that never scrolls nor has an item picked carries neither.
+  VOR2DManipulator* GetScrollManipulator();
+  VOR2DManipulator* GetItemManipulator();
+  // True once the manipulators exist (tests).
+  bool HasScrollManipulator() const { return _scrollManipulator != nullptr; }
+  bool HasItemManipulator() const { return _itemManipulator != nullptr; }
+  // True while the list follows its editor's selection (from its first item rep on).
+  bool IsWatchingSelection() const { return _watchingSelection; }
   VORPVBalloon* GetBalloon() const { return _balloon.get(); }
   // The range "ScrollListRange" gives, or fallback when it is unset or not a valid range.
   static int RangeFromEnvironment(int fallback);
@@ -126,8 +133,9 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   ~QELBaseScrollListZitBltRep() override;
 
  private:
-  void AddNotifications(VOR2DManipulator* itemManipulator);
-  void RemoveNotifications();
+  // Routes the selection's changes to this list (from its first item rep), and stops.
+  void WatchSelection();
+  void StopWatchingSelection();
   void RemoveScroller();
   // Shows the items first..first+range-1 and the links of the first range items.
   void UpdateShowModes();
@@ -151,7 +159,6 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   VORListValVORBaseUnknown_var _items;
   std::vector<int> _itemStates;  // parallel to _items
   VORListValVORBaseUnknown_var _appended;
-  VORManipulator* _btnManipulator = nullptr;
   VOR2DManipulator* _itemManipulator = nullptr;    // the creator's reference
   VOR2DManipulator* _scrollManipulator = nullptr;  // the creator's reference
   VORListValVORBaseUnknown_var _otherObjects;
@@ -170,11 +177,11 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   std::vector<int> _kinds;
 
   unsigned char _validTarget = 0;
-  bool _notificationsAdded = false;
+  bool _watchingSelection = false;
+  VORCSO_var _cso;  // the viewer's selection set, taken at BuildRep
   bool _itemsMoved = false;
   float _itemDragX = 0.0f;
   float _itemDragY = 0.0f;
-  VORCallbackId _contextCallback = 0;
   VORCallbackId _menuCallback = 0;
   VORBaseUnknown_var _dropTarget;  // the activity under the dragged items
   VORUnicodeString _dropRefusal;

@@ -75,8 +75,12 @@ int QELBaseScrollListZitBltRep::RangeFromEnvironment(int fallback) {
 }
 
 QELBaseScrollListZitBltRep::QELBaseScrollListZitBltRep(VORBaseUnknown* owner, int range)
-    : _owner(owner), _range(RangeFromEnvironment(range)) {
-  _itemManipulator = new VOR2DManipulator(this, "ActivManip", nullptr, 2, 0);
+    : _owner(owner), _range(RangeFromEnvironment(range)) {}
+
+VOR2DManipulator* QELBaseScrollListZitBltRep::GetScrollManipulator() {
+  // Made on first need (a scroll bar drawn, a script step): most lists of a level never scroll.
+  if (_scrollManipulator != nullptr)
+    return _scrollManipulator;
   _scrollManipulator = new VOR2DManipulator(this, "ScrollManip", nullptr, 1, 0);
   _scrollManipulator->SetDirection(VORMathVector2Df(0.0f, 1.0f));
   _scrollManipulator->SetPosition(VORMathAxis2D(
@@ -90,12 +94,25 @@ QELBaseScrollListZitBltRep::QELBaseScrollListZitBltRep(VORBaseUnknown* owner, in
               [this](VORBaseUnknown*, VORNotification*, void*) { OnScrollbarBalloonHide(); });
   AddCallback(scroll, VORManipulator::kVORActivate,
               [this](VORBaseUnknown*, VORNotification*, void*) { OnScrollbarBalloonHide(); });
+  return _scrollManipulator;
+}
+
+VOR2DManipulator* QELBaseScrollListZitBltRep::GetItemManipulator() {
+  // Made on first need (an item selected or dragged, a script step): a list nobody touches
+  // carries no manipulator and no callbacks.
+  if (_itemManipulator != nullptr)
+    return _itemManipulator;
+  _itemManipulator = new VOR2DManipulator(this, "ActivManip", nullptr, 2, 0);
+  VOREventPublisher* items = _itemManipulator->GetEventPublisher();
+  AddCallback(items, VORManipulator::kVORManipulate,
+              [this](VORBaseUnknown*, VORNotification*, void*) { OnVORManipulate(); });
+  AddCallback(items, VORManipulator::kVOREndManipulate,
+              [this](VORBaseUnknown*, VORNotification*, void*) { OnVOREndManipulate(); });
+  return _itemManipulator;
 }
 
 QELBaseScrollListZitBltRep::~QELBaseScrollListZitBltRep() {
-  RemoveNotifications();
-  if (_scrollManipulator != nullptr)
-    RemoveCallbacksOn(_scrollManipulator->GetEventPublisher());
+  StopWatchingSelection();
   DeselectItems();
   // The item reps hold their components and the components their reps: break each pair.
   for (const QELIScrollListZitBltItemVisu_var& visual : _itemVisuals) {
@@ -113,6 +130,9 @@ QELBaseScrollListZitBltRep::~QELBaseScrollListZitBltRep() {
   if (_balloon)
     _balloon->Hide(1);
   for (VOR2DManipulator* manipulator : {_itemManipulator, _scrollManipulator}) {
+    if (manipulator == nullptr)
+      continue;
+    RemoveCallbacksOn(manipulator->GetEventPublisher());
     manipulator->RemoveAllElements();
     manipulator->SetFather(nullptr);
     VORCommandDeletion(manipulator);
@@ -128,17 +148,10 @@ void QELBaseScrollListZitBltRep::BuildRep(VORViewer* viewer) {
   }
   if (!_expandedBag)
     return;
-  // The button's context menu offers the scroll bar entry instead of what others put there.
-  if (_btnManipulator != nullptr && _contextCallback != 0)
-    RemoveCallback(_contextCallback);
-  _btnManipulator = _manipulator;
-  _contextCallback = 0;
-  if (_btnManipulator != nullptr)
-    _contextCallback =
-        AddCallback(_btnManipulator->GetEventPublisher(), VORManipulator::kVORContext,
-                    [this](VORBaseUnknown*, VORNotification* n, void*) { OnZitBtnContextMenu(n); });
-  if (!_notificationsAdded)
-    AddNotifications(_itemManipulator);
+  // The selection set of the viewer's editor: the list starts watching it with its first item
+  // rep, before which nothing of the list can be picked.
+  if (!_cso)
+    _cso = CurrentCSO();
   if (!_items.IsEmpty()) {
     ReFreshZitBltReps(GetLocation());
   } else {
@@ -146,25 +159,19 @@ void QELBaseScrollListZitBltRep::BuildRep(VORViewer* viewer) {
   }
 }
 
-void QELBaseScrollListZitBltRep::AddNotifications(VOR2DManipulator* itemManipulator) {
-  VOREventPublisher* items = itemManipulator->GetEventPublisher();
-  AddCallback(items, VORManipulator::kVORManipulate,
-              [this](VORBaseUnknown*, VORNotification*, void*) { OnVORManipulate(); });
-  AddCallback(items, VORManipulator::kVOREndManipulate,
-              [this](VORBaseUnknown*, VORNotification*, void*) { OnVOREndManipulate(); });
-  _notificationsAdded = true;
-  if (VORCSO* cso = CurrentCSO()) {
-    QELScrollListSelectionWatch::Add(cso, this);
-    InitCSOElem(cso, 0);
-  }
+void QELBaseScrollListZitBltRep::WatchSelection() {
+  if (_watchingSelection || !_cso)
+    return;
+  _watchingSelection = true;
+  QELScrollListSelectionWatch::Add(_cso, this);
+  InitCSOElem(_cso, 0);
 }
 
-void QELBaseScrollListZitBltRep::RemoveNotifications() {
-  if (!_notificationsAdded)
+void QELBaseScrollListZitBltRep::StopWatchingSelection() {
+  if (!_watchingSelection)
     return;
-  RemoveCallbacksOn(_itemManipulator->GetEventPublisher());
   QELScrollListSelectionWatch::Remove(this);
-  _notificationsAdded = false;
+  _watchingSelection = false;
 }
 
 bool QELBaseScrollListZitBltRep::IsItDuplicate(VORBaseUnknown* item) const {
@@ -227,6 +234,7 @@ void QELBaseScrollListZitBltRep::AddListItemRep(VOR2DBagRep* bag, VORBaseUnknown
   auto component = VORHandle<QELPFViewerItemRepComponent>::Adopt(
       new QELPFViewerItemRepComponent(_owner, item, static_cast<unsigned int>(typeCode)));
   QELIScrollListZitBltItemVisu_var visual(component.get());
+  WatchSelection();
   _itemVisuals.push_back(visual);
   visual->SetItemPos(index, GetLocation());
   visual->SetZitBltName(GetName());
@@ -281,7 +289,7 @@ void QELBaseScrollListZitBltRep::RemoveAllItems(unsigned char greyButton) {
   if (greyButton == 1 && !IsButtonGrey())
     SetZitbltButtonGrey(1);
   // The track and the scroller go with the bag's other children.
-  if (_scroller)
+  if (_scroller && _scrollManipulator != nullptr)
     _scrollManipulator->RemoveElement(_scroller);
   _scroller = NULL_var;
   _track = NULL_var;
@@ -291,7 +299,8 @@ void QELBaseScrollListZitBltRep::RemoveAllItems(unsigned char greyButton) {
 
 void QELBaseScrollListZitBltRep::RemoveScroller() {
   if (_scroller) {
-    _scrollManipulator->RemoveElement(_scroller);
+    if (_scrollManipulator != nullptr)
+      _scrollManipulator->RemoveElement(_scroller);
     if (VOR2DBagRep* father = _scroller->GetFather())
       father->DestroyChild(_scroller);
   }
@@ -437,21 +446,21 @@ void QELBaseScrollListZitBltRep::AddScroller() {
   _scroller->SetLineThickness(kScrollerThickness);
   _expandedBag->AddChild(_track);
   _expandedBag->AddChild(_scroller);
-  _scrollManipulator->AddElement(_scroller);
+  GetScrollManipulator()->AddElement(_scroller);
 }
 
 void QELBaseScrollListZitBltRep::SetScrollPosition(double x, int first) {
   VORMathAxis2D axis;
-  _scrollManipulator->GetPosition(axis);
+  GetScrollManipulator()->GetPosition(axis);
   axis.origin.x = x;
   // A list that grows downwards reads its position negated.
   axis.origin.y = _growsUp ? first : -static_cast<double>(first);
-  _scrollManipulator->SetPosition(axis);
+  GetScrollManipulator()->SetPosition(axis);
 }
 
 void QELBaseScrollListZitBltRep::OnScrollbarManipulate() {
   VORMathAxis2D axis;
-  _scrollManipulator->GetPosition(axis);
+  GetScrollManipulator()->GetPosition(axis);
   const double x = axis.origin.x;
   double y = _growsUp ? axis.origin.y : -axis.origin.y;
   if (!(y >= 1.0)) {  // also catches a position that is not a number
@@ -574,12 +583,12 @@ QELIScrollListZitBltItemVisu* QELBaseScrollListZitBltRep::ItemOfThisList(
 void QELBaseScrollListZitBltRep::AddObjectToManip(VORPathElement* element) {
   VORIVisu_var visu{VORBaseUnknown_var(ItemOfThisList(element))};
   if (visu && visu->GetRep() != nullptr)
-    _itemManipulator->AddElement(visu->GetRep());
+    GetItemManipulator()->AddElement(visu->GetRep());
 }
 
 void QELBaseScrollListZitBltRep::RemoveObjectToManip(VORPathElement* element) {
   VORIVisu_var visu{VORBaseUnknown_var(ItemOfThisList(element))};
-  if (visu && visu->GetRep() != nullptr)
+  if (visu && visu->GetRep() != nullptr && _itemManipulator != nullptr)
     _itemManipulator->RemoveElement(visu->GetRep());
 }
 
@@ -613,6 +622,8 @@ void QELBaseScrollListZitBltRep::OnCSONotif(VORNotification* notif) {
 
 std::vector<QELIScrollListZitBltItemVisu_var> QELBaseScrollListZitBltRep::DraggedItems() const {
   std::vector<QELIScrollListZitBltItemVisu_var> dragged;
+  if (_itemManipulator == nullptr)
+    return dragged;
   for (const VORHandle<VOR2DRep>& element : _itemManipulator->GetElements()) {
     QELIScrollListZitBltItemVisu_var visual{VORBaseUnknown_var(element->GetObject())};
     if (visual && visual->GetAssociatedPFItem() != nullptr)
@@ -671,7 +682,7 @@ void QELBaseScrollListZitBltRep::JudgeDropTarget(const VORMathPoint2D& point) {
 void QELBaseScrollListZitBltRep::OnVORManipulate() {
   _csoBusy = 1;
   _validTarget = 0;
-  if (!_viewer || _itemManipulator->GetElementCount() == 0)
+  if (!_viewer || _itemManipulator == nullptr || _itemManipulator->GetElementCount() == 0)
     return;
   _viewer->SetCursor(kCursorDragging);
   const VORMathPoint2D point = _itemManipulator->GetCurrentPoint();
@@ -731,7 +742,7 @@ bool QELBaseScrollListZitBltRep::Drop() {
   if (moves.empty())
     return false;
   // The item reps are rebuilt by the refresh: nothing may ride on the manipulator any more.
-  _itemManipulator->RemoveAllElements();
+  GetItemManipulator()->RemoveAllElements();
   {
     const QELScrollListDrop::UndoStep step(target);
     for (const Move& move : moves)
@@ -749,7 +760,7 @@ void QELBaseScrollListZitBltRep::FinalizePertNodePosition() {
     _viewer->SetCursor(kCursorAfterDrag);
   if (_dropBalloon)
     _dropBalloon->Hide(1);
-  SendNotification(GetFather(), _itemManipulator->GetVOREndManipulate());
+  SendNotification(GetFather(), GetItemManipulator()->GetVOREndManipulate());
   const bool moved = _itemsMoved;
   _itemsMoved = false;
   _itemDragX = 0.0f;
@@ -779,6 +790,14 @@ VORNotifPropagation QELBaseScrollListZitBltRep::AnalyseNotification(VORCommand* 
                                                                     VORNotification* notif) {
   VORHandle<QELBaseScrollListZitBltRep> self(this);
   QELZitBltRep::AnalyseNotification(from, notif);
+  // The button's context menu offers the scroll bar entry instead of what others put there (the
+  // button's manipulator hands the menu on to this rep, its father).
+  if (notif != nullptr && _manipulator != nullptr && from == _manipulator &&
+      dynamic_cast<VORContext*>(notif) != nullptr) {
+    if (_expandedBag)
+      OnZitBtnContextMenu(notif);
+    return VORNotifDontPropagate;
+  }
   if (notif == nullptr || _manipulator == nullptr || from != _manipulator ||
       notif != _manipulator->GetVORManipulate())
     return VORNotifDontPropagate;
