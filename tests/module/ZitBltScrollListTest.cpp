@@ -101,6 +101,41 @@ TEST_F(ScrollListTest, WithoutAScrollerEveryItemShowsFromTheFirst) {
   }
 }
 
+TEST_F(ScrollListTest, AHiddenListThatDoesNotScrollIsDrawnWhenShownOrLookedAt) {
+  QELBaseScrollListZitBltRep* opened = Make("lefttop", 3);
+  QELBaseScrollListZitBltRep* looked = Make("lefttop", 3, 0, "ProductOutput");
+  for (QELBaseScrollListZitBltRep* rep : {opened, looked}) {
+    EXPECT_TRUE(rep->IsDrawingDeferred());
+    EXPECT_EQ(rep->GetZitBltExpanded()->GetSize(), 0);
+    EXPECT_FALSE(rep->IsButtonGrey()) << "the button tells the list has items all the same";
+  }
+  opened->ChangeBtnState();
+  EXPECT_FALSE(opened->IsDrawingDeferred());
+  EXPECT_EQ(opened->GetZitBltExpanded()->GetSize(), 3) << "drawn before it is shown";
+  ASSERT_EQ(looked->GetItemVisualCount(), 3);
+  EXPECT_FALSE(looked->IsDrawingDeferred());
+  for (int i = 1; i <= 3; ++i) {
+    EXPECT_EQ(Label(opened, i), Label(looked, i)) << i;
+    EXPECT_TRUE(LabelShown(opened, i) && LinkShown(opened, i)) << i;
+  }
+
+  // Shown by its status while closed, a list is drawn too; one that scrolls is never deferred.
+  QELBaseScrollListZitBltRep* shown = Make("leftbottom", 2);
+  shown->SetStatus(0);
+  shown->SetStatus(1);
+  EXPECT_EQ(shown->GetZitBltExpanded()->GetSize(), 2);
+  QELBaseScrollListZitBltRep* scrolling = Make("lefttop", 7);
+  EXPECT_FALSE(scrolling->IsDrawingDeferred());
+  EXPECT_GT(scrolling->GetZitBltExpanded()->GetSize(), 7) << "items, track and scroller";
+
+  // A button greyed while the drawing waits stays grey when it is carried out, as it would
+  // after a drawing made at once.
+  QELBaseScrollListZitBltRep* greyed = Make("lefttop", 2, 0, "Resource");
+  greyed->SetZitbltButtonGrey(1);
+  EXPECT_EQ(greyed->GetItemVisualCount(), 2);
+  EXPECT_TRUE(greyed->IsButtonGrey());
+}
+
 TEST_F(ScrollListTest, ScrollingToTheThirdOfSevenShiftsEveryLabelTwiceAndPlacesTheScroller) {
   QELBaseScrollListZitBltRep* rep = Make("lefttop", 7);
   ASSERT_NE(rep->GetScroller(), nullptr);

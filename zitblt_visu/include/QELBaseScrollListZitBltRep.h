@@ -111,11 +111,15 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
   // Why the activity under the dragged items refuses them (empty when it accepts them or
   // there is none); also shown in a balloon beside the pointer.
   const VORUnicodeString& GetDropRefusal() const { return _dropRefusal; }
-  int GetItemVisualCount() const { return static_cast<int>(_itemVisuals.size()); }
+  // The item reps and the scroll bar; a list whose drawing waits (see DeferDrawing) is drawn
+  // first.
+  int GetItemVisualCount();
   // 1-based; null out of range.
-  QELIScrollListZitBltItemVisu* GetItemVisual(int position) const;
-  VOR2DLineRep* GetScroller() const { return _scroller.get(); }
-  VOR2DPolygonRep* GetScrollTrack() const { return _track.get(); }
+  QELIScrollListZitBltItemVisu* GetItemVisual(int position);
+  VOR2DLineRep* GetScroller();
+  VOR2DPolygonRep* GetScrollTrack();
+  // True while the list's reps wait for the list to be shown (tests).
+  bool IsDrawingDeferred() const { return _drawPending; }
   // The scroller's and the selected items' manipulators, made with their callbacks on first
   // call: a list that never scrolls nor has an item picked carries neither.
   VOR2DManipulator* GetScrollManipulator();
@@ -131,8 +135,14 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
 
  protected:
   ~QELBaseScrollListZitBltRep() override;
+  void BeforeExpandedShown() override;
 
  private:
+  // A hidden list that does not scroll is drawn when it is first shown or looked at: its item
+  // reps are most of what a level of collapsed lists would cost. True when deferred.
+  bool DeferDrawing();
+  // Carries out a deferred drawing.
+  void DrawPending();
   // Routes the selection's changes to this list (from its first item rep), and stops.
   void WatchSelection();
   void StopWatchingSelection();
@@ -178,7 +188,9 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
 
   unsigned char _validTarget = 0;
   bool _watchingSelection = false;
-  VORCSO_var _cso;  // the viewer's selection set, taken at BuildRep
+  bool _drawPending = false;
+  bool _keepButtonColour = false;  // while a deferred drawing is carried out
+  VORCSO_var _cso;                 // the viewer's selection set, taken at BuildRep
   bool _itemsMoved = false;
   float _itemDragX = 0.0f;
   float _itemDragY = 0.0f;

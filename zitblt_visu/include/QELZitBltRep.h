@@ -97,6 +97,8 @@ class QELZitBltRep : public VORCommand {
  protected:
   ~QELZitBltRep() override;
   void SetTranslation(double x, double y);
+  // Called just before the expanded bag is shown (opened, or shown by its status).
+  virtual void BeforeExpandedShown() {}
 
   int _btnState = 0;
   VOR2DBagRep_var _btnBag;

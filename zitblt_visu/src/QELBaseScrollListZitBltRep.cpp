@@ -201,6 +201,7 @@ int QELBaseScrollListZitBltRep::GetItemState(int position) const {
 }
 
 void QELBaseScrollListZitBltRep::AppendItem(VORBaseUnknown* item, int kindFlag) {
+  DrawPending();
   AddItem(item, kindFlag);
   // The kind is recorded even for a refused duplicate; other flags record none.
   if (kindFlag == 0 || kindFlag == 1)
@@ -214,6 +215,7 @@ void QELBaseScrollListZitBltRep::RestoreButtonColour() {
 
 void QELBaseScrollListZitBltRep::AppendScrollList(VORBaseUnknown* item, bool noGreyChange,
                                                   int typeCode) {
+  DrawPending();
   if (item == nullptr)
     return;
   _appended.Append(VORBaseUnknown_var(item));
@@ -229,6 +231,7 @@ void QELBaseScrollListZitBltRep::AppendScrollList(VORBaseUnknown* item, bool noG
 
 void QELBaseScrollListZitBltRep::AddListItemRep(VOR2DBagRep* bag, VORBaseUnknown* item, int index,
                                                 int typeCode) {
+  DrawPending();
   if (bag == nullptr || !QELIListZitBltItem_var(VORBaseUnknown_var(item)))
     return;
   auto component = VORHandle<QELPFViewerItemRepComponent>::Adopt(
@@ -243,6 +246,7 @@ void QELBaseScrollListZitBltRep::AddListItemRep(VOR2DBagRep* bag, VORBaseUnknown
 }
 
 void QELBaseScrollListZitBltRep::ClearLists() {
+  DrawPending();
   _items.RemoveAll();
   _itemStates.clear();
   _appended.RemoveAll();
@@ -266,6 +270,7 @@ void QELBaseScrollListZitBltRep::DeselectItems() {
 }
 
 void QELBaseScrollListZitBltRep::RemoveAllItems(unsigned char greyButton) {
+  _drawPending = false;  // its reps would go at once
   DeselectItems();
   for (const QELIScrollListZitBltItemVisu_var& visual : _itemVisuals) {
     VORExtIVisu_var visu{VORBaseUnknown_var(visual.get())};
@@ -330,7 +335,39 @@ void QELBaseScrollListZitBltRep::ReFreshZitBltReps(const VORUnicodeString& locat
     DrawScrollList();
 }
 
+bool QELBaseScrollListZitBltRep::DeferDrawing() {
+  // Only a hidden list drawn from scratch that does not scroll: what such a drawing changes
+  // besides its reps (the first item, the button's colour) is done here, and its reps follow
+  // the same drawing later, as nothing the drawing reads changes meanwhile.
+  const int n = _items.Size();
+  if (n == 0 || !_expandedBag || _expandedBag->IsShown() || !_appended.IsEmpty() ||
+      !_itemVisuals.empty() || (n > _range && !_scrollBarHidden))
+    return false;
+  _first = 1;
+  RestoreButtonColour();
+  _drawPending = true;
+  ReDraw();
+  return true;
+}
+
+void QELBaseScrollListZitBltRep::DrawPending() {
+  if (!_drawPending)
+    return;
+  _drawPending = false;
+  // The button took its colour when the drawing was deferred; it may have been greyed since.
+  _keepButtonColour = true;
+  DrawScrollList();
+  _keepButtonColour = false;
+}
+
+void QELBaseScrollListZitBltRep::BeforeExpandedShown() {
+  DrawPending();
+}
+
 void QELBaseScrollListZitBltRep::DrawScrollList() {
+  DrawPending();
+  if (!_keepButtonColour && DeferDrawing())
+    return;
   const int n = _items.Size();
   const int r = _range;
   if (static_cast<long long>(_first) - 1 + r > n)
@@ -345,7 +382,7 @@ void QELBaseScrollListZitBltRep::DrawScrollList() {
   const bool kindsCoverVisible = static_cast<int>(_kinds.size()) >= last;
   for (int i = 1; i <= n; ++i) {
     const bool kept = kindsCoverVisible && _kinds[static_cast<size_t>(i - 1)] == 2;
-    AppendScrollList(_items[i], false, kept ? kKeptItemCode : kItemCode);
+    AppendScrollList(_items[i], _keepButtonColour, kept ? kKeptItemCode : kItemCode);
   }
   if (_scrollBarHidden)
     return;
@@ -561,7 +598,22 @@ void QELBaseScrollListZitBltRep::SetScrollRange(int range) {
   ReFreshZitBltReps(GetLocation());
 }
 
-QELIScrollListZitBltItemVisu* QELBaseScrollListZitBltRep::GetItemVisual(int position) const {
+int QELBaseScrollListZitBltRep::GetItemVisualCount() {
+  DrawPending();
+  return static_cast<int>(_itemVisuals.size());
+}
+
+VOR2DLineRep* QELBaseScrollListZitBltRep::GetScroller() {
+  DrawPending();
+  return _scroller.get();
+}
+
+VOR2DPolygonRep* QELBaseScrollListZitBltRep::GetScrollTrack() {
+  DrawPending();
+  return _track.get();
+}
+
+QELIScrollListZitBltItemVisu* QELBaseScrollListZitBltRep::GetItemVisual(int position) {
   if (position < 1 || position > GetItemVisualCount())
     return nullptr;
   return _itemVisuals[static_cast<size_t>(position - 1)].get();

@@ -211,6 +211,8 @@ void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
 }
 
 void QELZitBltRep::SetShowMode(int mode) {
+  if (_expandedBag && mode == 0)
+    BeforeExpandedShown();
   if (_expandedBag)
     _expandedBag->SetShowMode(mode);
   ReDraw();
@@ -219,6 +221,7 @@ void QELZitBltRep::SetShowMode(int mode) {
 void QELZitBltRep::ExpandZitBlt() {
   _collapsed = 0;
   if (_expandedBag) {
+    BeforeExpandedShown();
     _expandedBag->SetShowMode(0);
     if (_viewer)
       _viewer->Draw();
@@ -259,6 +262,8 @@ void QELZitBltRep::SetStatus(unsigned char status) {
   const int mode = status == 1 ? 0 : 1;
   if (_btnBag)
     _btnBag->SetShowMode(mode);
+  if (_expandedBag && mode == 0)
+    BeforeExpandedShown();
   if (_expandedBag)
     _expandedBag->SetShowMode(mode);
 }
