@@ -131,10 +131,7 @@ TEST(RoundTripTest, GeneratedLinesOfSeveralSizesRoundTrip) {
 }
 
 TEST(LoadErrorTest, MessagesNameTheFileWithLineAndColumnOrTheOffendingId) {
-  struct Case {
-    std::string from, to, expected;
-  };
-  const std::vector<Case> cases = {
+  const std::vector<LoadRefusal> cases = {
       {"<flow from=\"A2\" to=\"A3\"/>", "<flow from=\"A2\" to=\"A3\">",
        "bad.pprx:19:7: expected end of tag 'flow'"},
       {"<product id=\"P2\"", "<product id=\"P1\"", "bad.pprx:5:5: duplicate id 'P1'"},
@@ -158,13 +155,7 @@ TEST(LoadErrorTest, MessagesNameTheFileWithLineAndColumnOrTheOffendingId) {
        "does not join two children"},
       {"</process>", "</process><extra/>", "unexpected element <extra>"},
   };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.to);
-    std::string error;
-    VORProcess_var doc = LoadText(Replace(kValid, c.from, c.to), error);
-    EXPECT_FALSE(doc);
-    EXPECT_NE(error.find(c.expected), std::string::npos) << error;
-  }
+  ExpectRefusals(kValid, cases);
   std::string error;
   EXPECT_TRUE(LoadText(kValid, error)) << error;
   EXPECT_FALSE(VORProcess_var::Adopt(VORProcess::Load("/no/such/file.pprx", error)));

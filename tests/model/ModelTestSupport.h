@@ -45,6 +45,20 @@ inline std::string Replace(std::string text, const std::string& from, const std:
   return at == std::string::npos ? text : text.replace(at, from.size(), to);
 }
 
+// A damaged document: the text from of a valid one replaced by to, refused with a message
+// holding expected.
+struct LoadRefusal {
+  std::string from, to, expected;
+};
+inline void ExpectRefusals(const std::string& valid, const std::vector<LoadRefusal>& cases) {
+  for (const LoadRefusal& c : cases) {
+    SCOPED_TRACE(c.to);
+    std::string error;
+    EXPECT_FALSE(LoadText(Replace(valid, c.from, c.to), error));
+    EXPECT_NE(error.find(c.expected), std::string::npos) << error;
+  }
+}
+
 // Records the activity notifications of a root process: "kind father son" per line.
 class ActivityRecorder {
  public:
