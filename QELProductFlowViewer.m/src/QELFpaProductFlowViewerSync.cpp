@@ -181,9 +181,12 @@ void QELFpaProductFlowViewer::AddCallbacks() {
   VOR_ASSERT_AT(NULL_var != modelNode, kModule, 357);
   // The controller dispatches the chart's notifications on the chart root's own dispatcher;
   // after a level switch the new root is not yet the controller's, so subscribe there directly.
+  // The sender is not needed: the lambda form spares a cast per node notification.
   if (VORIModelEvents_var events(_rootNode); events)
     _pertNodeCallback = AddCallback(events->GetEventPublisher(), VORNotification::ClassName(),
-                                    &QELFpaProductFlowViewer::ONPertNodeModification);
+                                    [this](VORBaseUnknown*, VORNotification* n, void* data) {
+                                      ONPertNodeModification(nullptr, n, data);
+                                    });
   AddCallBackOnRootProduct();
   AddCallbackOnMA();
 }

@@ -29,6 +29,20 @@ const VORTrace& Trace() {
 
 constexpr const char* kCatalog = "QELFpaProductFlowViewer";
 
+// The chart rebuilds each link once when the layout is done, not once per moved end.
+class MoveBatch {
+ public:
+  explicit MoveBatch(QELPertController* controller) : _controller(controller) {
+    _controller->BeginMoves();
+  }
+  ~MoveBatch() { _controller->EndMoves(); }
+  MoveBatch(const MoveBatch&) = delete;
+  MoveBatch& operator=(const MoveBatch&) = delete;
+
+ private:
+  QELPertController* _controller;
+};
+
 }  // namespace
 
 QELPFVNodeOrganiser::QELPFVNodeOrganiser()
@@ -238,23 +252,36 @@ bool QELPFVNodeOrganiser::ArrangeNodes(VORBaseUnknown_var root, QELPertControlle
       rootPert->GetPosition(x, y, 1);
   }
   const QELIPertNode_var noNode;
-  for (VORListValVORBaseUnknown_var* list : *_levelLists) {
-    const int count = list->Size();
-    float yStep = 0.0f;
-    if (count > 0) {
-      yStep = side / static_cast<float>(count);
-      y = side / static_cast<float>(2 * count);
+  {
+    const MoveBatch batch(_controller);
+    for (VORListValVORBaseUnknown_var* list : *_levelLists) {
+      const int count = list->Size();
+      float yStep = 0.0f;
+      if (count > 0) {
+        yStep = side / static_cast<float>(count);
+        y = side / static_cast<float>(2 * count);
+      }
+      for (VORBaseUnknown_var& node : *list) {
+        // A node the chart shows moves through the chart, which holds its interfaces.
+        double snappedX = x;
+        double snappedY = y;
+        QELPertClientVisuServices::CalculateSnapPositionInPert(snappedX, snappedY, 1, noNode);
+        if (MoveThroughChart(node, snappedX, snappedY)) {
+          x = snappedX;
+          y = snappedY + yStep;
+          continue;
+        }
+        const QELIPertNode_var pertNode(node);
+        if (!pertNode)
+          continue;
+        x = snappedX;
+        y = snappedY;
+        SetNodePosition(node, pertNode, x, y);
+        y += yStep;
+        Announce(node, pertNode);
+      }
+      x += xStep;
     }
-    for (VORBaseUnknown_var& node : *list) {
-      const QELIPertNode_var pertNode(node);
-      if (!pertNode)
-        continue;
-      QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 1, noNode);
-      SetNodePosition(node, pertNode, x, y);
-      y += yStep;
-      Announce(node, pertNode);
-    }
-    x += xStep;
   }
   _controller->GetViewer()->Reframe();
   return true;
@@ -357,6 +384,7 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
     double y = 0.0;
     auto found = newNode ? sortedIndex.find(newNode.Identity()) : sortedIndex.end();
     if (found != sortedIndex.end()) {
+      const MoveBatch batch(_controller);
       const int k0 = (*_levelList)[found->second] + 1;
       if (k0 > 1) {
         VORListValVORBaseUnknown_var* previous = (*_levelLists)[k0 - 1];
@@ -375,11 +403,21 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
         }
         x += xStep;
         for (VORBaseUnknown_var& node : *list) {
+          const bool moves = change.count(node.Identity()) != 0;
+          double snappedX = x;
+          double snappedY = y;
+          QELPertClientVisuServices::CalculateSnapPositionInPert(snappedX, snappedY, 1, noNode);
+          if (moves && MoveThroughChart(node, snappedX, snappedY)) {
+            x = snappedX;
+            y = snappedY + yStep;
+            continue;
+          }
           const QELIPertNode_var pertNode(node);
           if (!pertNode)
             continue;
-          QELPertClientVisuServices::CalculateSnapPositionInPert(x, y, 1, noNode);
-          if (change.count(node.Identity()) != 0) {
+          x = snappedX;
+          y = snappedY;
+          if (moves) {
             SetNodePosition(node, pertNode, x, y);
             Announce(node, pertNode);
           }
@@ -411,6 +449,27 @@ void QELPFVNodeOrganiser::Announce(VORBaseUnknown_var& node, const QELIPertNode_
     return;
   VORBaseUnknown_var reference;
   position->GetReferenceObject(reference);
+  NotifyMove(node, reference, x, y);
+}
+
+bool QELPFVNodeOrganiser::MoveThroughChart(VORBaseUnknown_var& node, double x, double y) {
+  VORBaseUnknown* known = nullptr;
+  if (_controller == nullptr || _controller->MoveNodeTo(node, x, y, true, known) != S_OK)
+    return false;
+  Trace().TraPrint("QELPFVNodeOrganiser::DispatchNotif -->");
+  VORBaseUnknown_var reference(known);
+  if (!reference) {
+    QELIPertPosition_var position(node);
+    if (!position)
+      return true;
+    position->GetReferenceObject(reference);
+  }
+  NotifyMove(node, reference, x, y);
+  return true;
+}
+
+void QELPFVNodeOrganiser::NotifyMove(VORBaseUnknown_var& node, const VORBaseUnknown_var& reference,
+                                     double x, double y) {
   // The nodes of one level share their reference object: its events are looked up once.
   if (reference.Identity() != _eventsOf) {
     _eventsOf = reference.Identity();

@@ -54,6 +54,12 @@ class QELPFVNodeOrganiser : public VORCommand {
                        double y);
   // DispatchNotif with the node's QELIPertNode already at hand.
   void Announce(VORBaseUnknown_var& node, const QELIPertNode_var& pertNode);
+  // SetNodePosition and Announce for a node the chart shows, through the interfaces the chart
+  // holds; false, and nothing done, for a node it does not show.
+  bool MoveThroughChart(VORBaseUnknown_var& node, double x, double y);
+  // The position notification on the reference object's model events.
+  void NotifyMove(VORBaseUnknown_var& node, const VORBaseUnknown_var& reference, double x,
+                  double y);
 
   VORListValVORBaseUnknown_var* _childNodeList = nullptr;
   VORRawCollint* _levelList;

@@ -50,11 +50,27 @@ class QELPertController : public VORCommand {
   // Moves the node's box to its current position (QELIPertNodeExt) and redraws its links;
   // redraw asks the viewer to repaint.
   HRESULT RefreshNodePositionInPert(VORBaseUnknown_var& node, bool redraw);
+  // For layouts: writes the node's position as QELIPertNode::SetPosition and
+  // QELIPertNodeExt::SetPosition do, then moves its box as RefreshNodePositionInPert does, with
+  // the interfaces the chart asked for when it drew the node. reference receives the object
+  // whose model events hear of the node's moves (as QELIPertPosition::GetReferenceObject
+  // answers; null when the chart does not know it). E_FAIL, and nothing is written, when the
+  // node is not in the chart.
+  HRESULT MoveNodeTo(VORBaseUnknown_var& node, double x, double y, bool redraw,
+                     VORBaseUnknown*& reference);
   void RemoveAllPertNodes();
   // Drops the node manipulator's subscriptions (before the controller is destroyed).
   void RemoveNodeManipCmdCB();
   // Rebuilds every link of the chart from the flows in the model.
   void RefreshLinks();
+
+  // Between BeginMoves and EndMoves (calls nest), a node move marks its links and the repaint
+  // as due instead of doing them: EndMoves rebuilds each marked link once, however many of its
+  // ends moved, and asks for one repaint. For layouts that move every node of a level.
+  void BeginMoves();
+  void EndMoves();
+  // Links rebuilt since the controller was made: what moves cost, for fan-out tests.
+  unsigned long GetLinkRebuildCount() const { return _linkRebuilds; }
 
   // Super nodes (used by QELPertNodeTraverser).
   HRESULT ShowInnerNodes(VORBaseUnknown* superNode);
@@ -107,6 +123,7 @@ class QELPertController : public VORCommand {
     Node* from = nullptr;
     Node* to = nullptr;
     VOR2DCustomRep_var rep;
+    bool due = false;  // in _dueLinks: to be rebuilt at EndMoves
   };
 
   Node* Find(VORBaseUnknown* node) const;
@@ -114,12 +131,16 @@ class QELPertController : public VORCommand {
   void RemoveNode(Node* node, bool announce);
   void AddLinksOf(Node* node);
   void UpdateLink(Link* link);
+  // UpdateLink now, or at EndMoves while moves are batched.
+  void RefreshLink(Link* link);
+  void ForgetDueLink(Link* link);
   void BuildShape(Node* node);
   void PlaceNode(Node* node);
   static void FitLabel(VOR2DTextRep& label, const VORUnicodeString& text, double boxWidth,
                        double boxHeight);
   void PlaceInnerNodes(Node* node);
   void ReadPosition(Node* node);
+  void Refresh(Node* node, bool redraw);
   void ShiftInner(Node* node, double dx, double dy);
   void ResizeOwners(Node* node);
   void Announce(VORBaseUnknown* node, int removeRep);
@@ -145,4 +166,8 @@ class QELPertController : public VORCommand {
   VOR2DManipulator_var _manipulator;
   double _dragStartX = 0.0;
   double _dragStartY = 0.0;
+  int _moveBatches = 0;
+  std::vector<Link*> _dueLinks;
+  bool _drawDue = false;
+  unsigned long _linkRebuilds = 0;
 };

@@ -32,16 +32,16 @@ std::vector<VORMathPoint2Df> BoxPoints(double w, double h) {
 }
 
 // Arrow head at q pointing along x, barbs of length 2 at 18 degrees from the shaft.
-VOR2DPolylineGP* ArrowHead(const VORMathPoint2Df& p, const VORMathPoint2Df& q) {
+void ArrowHead(const VORMathPoint2Df& p, const VORMathPoint2Df& q, VORMathPoint2Df (&points)[3]) {
   const float d = q.x >= p.x ? 1.0f : -1.0f;
   const double angle = 2.82744;
   const auto ax = static_cast<float>(d * std::cos(angle));
   const auto ay = static_cast<float>(d * std::sin(angle));
   const auto bx = static_cast<float>(d * std::cos(-angle));
   const auto by = static_cast<float>(d * std::sin(-angle));
-  const VORMathPoint2Df points[3] = {
-      {q.x + 2.0f * bx, q.y + 2.0f * by}, q, {q.x + 2.0f * ax, q.y + 2.0f * ay}};
-  return new VOR2DPolylineGP(points, 3, 1);
+  points[0] = {q.x + 2.0f * bx, q.y + 2.0f * by};
+  points[1] = q;
+  points[2] = {q.x + 2.0f * ax, q.y + 2.0f * ay};
 }
 
 }  // namespace
@@ -332,11 +332,53 @@ void QELPertController::UpdateLink(Link* link) {
                           static_cast<float>(b->y - oy));
   const auto m = static_cast<float>((p.x + q.x) * 0.5);
   const VORMathPoint2Df route[4] = {p, {m, p.y}, {m, q.y}, q};
+  VORMathPoint2Df head[3];
+  ArrowHead(p, q, head);
+  ++_linkRebuilds;
+  // A link drawn before keeps its two polylines: only their points change.
+  if (link->rep->GetPrimitiveCount() == 2 && link->rep->ModifyPolyline(1, route, 4) &&
+      link->rep->ModifyPolyline(2, head, 3))
+    return;
   const std::uint32_t word =
       VOR2DGraphicAttribute::Pack(QELPertParameters::LinkColor, 4, 1, 4, false, true);
   link->rep->RemoveAllPrimitives();
   link->rep->AddPrimitive(new VOR2DPolylineGP(route, 4, 1), word, 255);
-  link->rep->AddPrimitive(ArrowHead(p, q), word, 255);
+  link->rep->AddPrimitive(new VOR2DPolylineGP(head, 3, 1), word, 255);
+}
+
+void QELPertController::RefreshLink(Link* link) {
+  if (_moveBatches == 0) {
+    UpdateLink(link);
+    return;
+  }
+  if (!link->due) {
+    link->due = true;
+    _dueLinks.push_back(link);
+  }
+}
+
+void QELPertController::ForgetDueLink(Link* link) {
+  if (link->due)
+    std::erase(_dueLinks, link);
+  link->due = false;
+}
+
+void QELPertController::BeginMoves() {
+  ++_moveBatches;
+}
+
+void QELPertController::EndMoves() {
+  if (_moveBatches == 0 || --_moveBatches > 0)
+    return;
+  std::vector<Link*> due;
+  due.swap(_dueLinks);
+  for (Link* link : due) {
+    link->due = false;
+    UpdateLink(link);
+  }
+  if (_drawDue && _viewer)
+    _viewer->Draw();
+  _drawDue = false;
 }
 
 void QELPertController::Announce(VORBaseUnknown* node, int removeRep) {
@@ -365,6 +407,25 @@ HRESULT QELPertController::RefreshNodePositionInPert(VORBaseUnknown_var& object,
   Node* node = Find(object);
   if (node == nullptr)
     return E_FAIL;
+  Refresh(node, redraw);
+  return S_OK;
+}
+
+HRESULT QELPertController::MoveNodeTo(VORBaseUnknown_var& object, double x, double y, bool redraw,
+                                      VORBaseUnknown*& reference) {
+  reference = nullptr;
+  Node* node = Find(object);
+  if (node == nullptr || node->ext == nullptr)
+    return E_FAIL;
+  QELPertWritePosition(*node->ext, node->layout.get(), x, y);
+  node->ext->SetPosition(x, y, 1);
+  Refresh(node, redraw);
+  // What QELIPertPosition answers first; null leaves the caller to ask it.
+  reference = node->ext->GetReference();
+  return S_OK;
+}
+
+void QELPertController::Refresh(Node* node, bool redraw) {
   const double oldX = node->x;
   const double oldY = node->y;
   ReadPosition(node);
@@ -372,11 +433,14 @@ HRESULT QELPertController::RefreshNodePositionInPert(VORBaseUnknown_var& object,
     ShiftInner(node, node->x - oldX, node->y - oldY);
   PlaceNode(node);
   for (Link* link : node->links)
-    UpdateLink(link);
+    RefreshLink(link);
   ResizeOwners(node);
-  if (redraw && _viewer)
-    _viewer->Draw();
-  return S_OK;
+  if (redraw && _viewer) {
+    if (_moveBatches > 0)
+      _drawDue = true;
+    else
+      _viewer->Draw();
+  }
 }
 
 void QELPertController::ShiftInner(Node* node, double dx, double dy) {
@@ -396,7 +460,7 @@ void QELPertController::ResizeOwners(Node* node) {
   for (Node* owner = node->level->ownerNode; owner != nullptr; owner = owner->level->ownerNode) {
     BuildShape(owner);
     for (Link* link : owner->links)
-      UpdateLink(link);
+      RefreshLink(link);
   }
 }
 
@@ -473,6 +537,7 @@ void QELPertController::RemoveNode(Node* node, bool announce) {
   for (Link* link : std::vector<Link*>(node->links)) {
     Node* other = link->from == node ? link->to : link->from;
     std::erase(other->links, link);
+    ForgetDueLink(link);
     level->links->RemoveChild(link->rep);
     std::erase_if(level->linkList, [link](const auto& l) { return l.get() == link; });
   }
@@ -549,6 +614,7 @@ void QELPertController::ClearChart() {
   }
   if (_manipulator)
     _manipulator->RemoveAllElements();
+  _dueLinks.clear();
   _nodes.clear();
   _top->members.clear();
   _top->linkList.clear();
@@ -575,6 +641,7 @@ void QELPertController::RefreshLinks() {
     if (node->inner)
       levels.push_back(node->inner.get());
   }
+  _dueLinks.clear();
   for (Level* level : levels) {
     level->linkList.clear();
     level->links->EmptyBag();

@@ -61,6 +61,20 @@ HRESULT QELEPertNodeExt::SetState(int state) {
   return S_OK;
 }
 
+HRESULT QELPertWritePosition(QELEPertNodeExt& ext, VORIGraphNodeLayout* layout, double x,
+                             double y) {
+  const HRESULT hr = ext.SetPosition(x, y, 1);
+  if (layout == nullptr)
+    return E_FAIL;
+  double ox = 0.0;
+  double oy = 0.0;
+  layout->GetPertPosition(ox, oy);
+  // One door change only when the stored position really changes.
+  if (!layout->HasPertPosition() || ox != x || oy != y)
+    layout->SetPertPosition(x, y);
+  return hr;
+}
+
 QELEPertNodeExt* QELEPertNodeExt::Of(VORBaseUnknown* node) {
   if (node == nullptr)
     return nullptr;
@@ -82,21 +96,9 @@ class QELEPertNode : public VORExtension, public QELIPertNode {
     QELEPertNodeExt* ext = QELEPertNodeExt::Of(GetExtendedObject());
     if (ext == nullptr)
       return E_FAIL;
-    // The chart's own position first: a chart that hears of the document change then knows it
-    // made it (see QELPertController::OnModelMoved).
-    const HRESULT hr = ext->SetPosition(x, y, index);
-    if (index == 1) {
-      VORIGraphNodeLayout_var layout(GetExtendedObject());
-      if (!layout)
-        return E_FAIL;
-      double ox = 0.0;
-      double oy = 0.0;
-      layout->GetPertPosition(ox, oy);
-      // One door change only when the stored position really changes.
-      if (!layout->HasPertPosition() || ox != x || oy != y)
-        layout->SetPertPosition(x, y);
-    }
-    return hr;
+    if (index != 1)
+      return ext->SetPosition(x, y, index);
+    return QELPertWritePosition(*ext, VORIGraphNodeLayout_var(GetExtendedObject()).get(), x, y);
   }
   HRESULT GetSize(double& width, double& height) override {
     QELEPertNodeExt* ext = QELEPertNodeExt::Of(GetExtendedObject());

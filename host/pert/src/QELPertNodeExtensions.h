@@ -3,6 +3,7 @@
 #pragma once
 
 #include "QELIPertNodeExt.h"
+#include "VORIGraphNodeLayout.h"
 #include "VORExtension.h"
 
 class QELEPertNodeExt : public VORExtension, public QELIPertNodeExt {
@@ -59,6 +60,12 @@ class QELEPertNodeExt : public VORExtension, public QELIPertNodeExt {
   double _drawnW = 0.0;
   double _drawnH = 0.0;
 };
+
+// What QELIPertNode::SetPosition does with index 1, for callers that hold the node's extension
+// and layout already: the working copy first (a chart that hears of the document change then
+// knows it made it, see QELPertController::OnModelMoved), then one door change when the stored
+// position really changes. E_FAIL without a layout.
+HRESULT QELPertWritePosition(QELEPertNodeExt& ext, VORIGraphNodeLayout* layout, double x, double y);
 
 // Registers QELIPertNodeExt, QELIPertNode and QELIPertPosition on graph nodes (VORInitPert).
 void QELPertRegisterNodeExtensions();

@@ -20,6 +20,10 @@ class VOR2DCustomRep : public VOR2DRep {
     return AddPrimitive(primitive, VOR2DGraphicAttribute(word, static_cast<std::uint8_t>(alpha)));
   }
   void RemoveAllPrimitives();
+  // Gives the polyline at position (1-based) new points in place, keeping its attribute: a rep
+  // redrawn often (a link whose ends move) keeps its primitives instead of rebuilding them.
+  // False, and nothing changes, when there is no polyline at position.
+  bool ModifyPolyline(int position, const VORMathPoint2Df* points, int count);
   int GetPrimitiveCount() const { return static_cast<int>(_primitives.size()); }
   const VOR2DGP* GetPrimitive(int position) const;  // 1-based, null out of range
   VOR2DGraphicAttribute GetAttribute(int position) const;

@@ -24,6 +24,8 @@ class VOR2DPolylineGP : public VOR2DGP {
   int GetPointCount() const { return static_cast<int>(_points.size()); }
   int GetMode() const { return _mode; }
   bool IsClosed() const { return _mode == 2; }
+  // New points, the mode kept; the storage is reused when it is large enough.
+  void SetPoints(const VORMathPoint2Df* points, int count);
 
   VORBox2D GetBoundingBox() const override;
   bool HitTest(const VORMathPoint2D& p, double tolerance) const override;

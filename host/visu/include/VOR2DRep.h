@@ -70,6 +70,9 @@ class VOR2DRep : public VORBaseUnknown {
   VORManipulator* GetManipulator() const { return _manipulator; }
 
   VORBox2D GetBoundingBox() const;
+  // Boxes computed again (cache misses of GetBoundingBox) in this process: what a change costs,
+  // for fan-out tests.
+  static unsigned long long BoxesComputed();
   void GetBoundingBox(VORBox2D& box) const { box = GetBoundingBox(); }
   void GetBoundingBox(float& xmin, float& ymin, float& xmax, float& ymax) const;
 

@@ -35,6 +35,8 @@ enum VORCursorShape {
   VORCursorSelect = 25,      // plain pointer after a drag ended
 };
 
+class VORModelForRep2D;
+
 // A selection click: the picked paths front to back (possibly none: a click on the background).
 class VORViewerPickNotification : public VORNotification {
   VOR_DECLARE_CLASS(VORViewerPickNotification, VORNotification)
@@ -157,6 +159,9 @@ class VORViewer : public VORCommand {
   void ViewChanged() { ++_viewChanges; }
   void SetDirty() { _dirty = true; }
   void FollowISOs();
+  // The rep models of each attached set, in the set's order: asked of the set's elements once
+  // after each change of the sets, not on every frame or reframe.
+  const std::vector<std::vector<VORModelForRep2D*>>& ISOModels();
   std::vector<VORPathElement_var> PathsFromHits(const std::vector<VORPickHit>& hits) const;
   void UpdateHover(double px, double py, int modifiers);
   void SelectionPick(double px, double py, int modifiers);
@@ -168,6 +173,8 @@ class VORViewer : public VORCommand {
   VOR2DViewpoint_var _viewpoint;
   std::vector<VOR2DRep_var> _reps;
   std::vector<VORISO_var> _isos;
+  std::vector<std::vector<VORModelForRep2D*>> _isoModels;  // held by the sets
+  bool _isoModelsValid = false;
   float _background[3] = {1.0f, 1.0f, 1.0f};
   bool _selectable = false;
   int _multiSel = 0;

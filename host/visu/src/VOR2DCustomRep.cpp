@@ -13,6 +13,18 @@ void VOR2DCustomRep::RemoveAllPrimitives() {
   Invalidate();
 }
 
+bool VOR2DCustomRep::ModifyPolyline(int position, const VORMathPoint2Df* points, int count) {
+  if (position < 1 || position > GetPrimitiveCount())
+    return false;
+  auto* polyline = dynamic_cast<VOR2DPolylineGP*>(
+      _primitives[static_cast<size_t>(position - 1)].primitive.get());
+  if (polyline == nullptr)
+    return false;
+  polyline->SetPoints(points, count);
+  Invalidate();
+  return true;
+}
+
 const VOR2DGP* VOR2DCustomRep::GetPrimitive(int position) const {
   if (position < 1 || position > GetPrimitiveCount())
     return nullptr;

@@ -12,6 +12,12 @@ VOR2DPolylineGP::VOR2DPolylineGP(const float* xy, int count, int mode) : _mode(m
     _points.emplace_back(xy[2 * i], xy[2 * i + 1]);
 }
 
+void VOR2DPolylineGP::SetPoints(const VORMathPoint2Df* points, int count) {
+  if (points == nullptr || count < 0)
+    count = 0;
+  _points.assign(points, points + count);
+}
+
 VORBox2D VOR2DPolylineGP::GetBoundingBox() const {
   VORBox2D box;
   for (const VORMathPoint2Df& p : _points)

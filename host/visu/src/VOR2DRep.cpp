@@ -10,6 +10,10 @@ unsigned long& Generation() {
   static unsigned long generation = 1;
   return generation;
 }
+unsigned long long& BoxCount() {
+  static unsigned long long count = 0;
+  return count;
+}
 }  // namespace
 
 unsigned long VORSceneGeneration() {
@@ -51,8 +55,13 @@ void VOR2DRep::SetTag(const std::string& tag) {
   Touch();
 }
 
+unsigned long long VOR2DRep::BoxesComputed() {
+  return BoxCount();
+}
+
 VORBox2D VOR2DRep::GetBoundingBox() const {
   if (!_boxValid) {
+    ++BoxCount();
     _box = ComputeBoundingBox();
     _boxValid = true;
   }

@@ -53,7 +53,11 @@ void VORViewer::AttachISO(VORISO* iso) {
   if (std::find(_isos.begin(), _isos.end(), VORISO_var(iso)) != _isos.end())
     return;
   _isos.emplace_back(iso);
-  auto dirty = [this](VORBaseUnknown*, VORNotification*, void*) { _dirty = true; };
+  _isoModelsValid = false;
+  auto dirty = [this](VORBaseUnknown*, VORNotification*, void*) {
+    _dirty = true;
+    _isoModelsValid = false;
+  };
   AddCallback(iso->GetEventPublisher(), "VORISOAdd", dirty);
   AddCallback(iso->GetEventPublisher(), "VORISORemove", dirty);
   _dirty = true;
@@ -67,7 +71,26 @@ void VORViewer::DetachISO(VORISO* iso) {
   RemoveCallbacksOn(iso->GetEventPublisher());
   iso->RemoveViewer(this);
   _isos.erase(it);
+  _isoModelsValid = false;
   _dirty = true;
+}
+
+const std::vector<std::vector<VORModelForRep2D*>>& VORViewer::ISOModels() {
+  FollowISOs();
+  if (_isoModelsValid)
+    return _isoModels;
+  _isoModels.assign(_isos.size(), {});
+  for (size_t i = 0; i < _isos.size(); ++i) {
+    const auto& elements = _isos[i]->GetElements();
+    _isoModels[i].reserve(static_cast<size_t>(elements.Size()));
+    for (const VORBaseUnknown_var& element : elements) {
+      VORHandle<VORModelForRep2D> model(element);
+      if (model)
+        _isoModels[i].push_back(model.get());
+    }
+  }
+  _isoModelsValid = true;
+  return _isoModels;
 }
 
 void VORViewer::FollowISOs() {
@@ -92,10 +115,9 @@ VORBox2D VORViewer::GetSceneBox() {
     if (rep->IsShown())
       box.Extend(rep->GetBoundingBox());
   }
-  for (const VORISO_var& iso : _isos) {
-    for (const VORBaseUnknown_var& element : iso->GetElements()) {
-      VORHandle<VORModelForRep2D> model(element);
-      if (model && model->GetRep() != nullptr && model->GetRep()->IsShown())
+  for (const std::vector<VORModelForRep2D*>& models : ISOModels()) {
+    for (const VORModelForRep2D* model : models) {
+      if (model->GetRep() != nullptr && model->GetRep()->IsShown())
         box.Extend(model->GetRep()->GetBoundingBox());
     }
   }
@@ -210,10 +232,9 @@ const VORRenderList& VORViewer::GetRenderList() {
     context.highlightOf = [this](VORBaseUnknown* object) { return HighlightOf(object); };
   for (const VOR2DRep_var& rep : _reps)
     rep->Flatten(context);
-  for (const VORISO_var& iso : _isos) {
-    for (const VORBaseUnknown_var& element : iso->GetElements()) {
-      VORHandle<VORModelForRep2D> model(element);
-      if (model && model->GetRep() != nullptr)
+  for (const std::vector<VORModelForRep2D*>& models : ISOModels()) {
+    for (const VORModelForRep2D* model : models) {
+      if (model->GetRep() != nullptr)
         model->GetRep()->Flatten(context);
     }
   }
@@ -229,12 +250,11 @@ std::vector<VORPickHit> VORViewer::PickReps(double x, double y, double tolerance
   std::vector<VOR2DRep*> chain;
   const VORMathPoint2D p(x, y);
   // The set's reps are drawn last, so they are in front.
-  for (auto iso = _isos.rbegin(); iso != _isos.rend(); ++iso) {
-    const auto& elements = (*iso)->GetElements();
-    for (int i = elements.Size(); i >= 1; --i) {
-      VORHandle<VORModelForRep2D> model(elements[i]);
-      if (model && model->GetRep() != nullptr)
-        model->GetRep()->CollectPicks(p, tolerance, chain, hits);
+  const std::vector<std::vector<VORModelForRep2D*>>& isoModels = ISOModels();
+  for (auto models = isoModels.rbegin(); models != isoModels.rend(); ++models) {
+    for (auto model = models->rbegin(); model != models->rend(); ++model) {
+      if ((*model)->GetRep() != nullptr)
+        (*model)->GetRep()->CollectPicks(p, tolerance, chain, hits);
     }
   }
   for (auto rep = _reps.rbegin(); rep != _reps.rend(); ++rep)
