@@ -175,6 +175,64 @@ TEST_F(ControllerTest, PickingFindsTheNodeUnderThePointerAndLinksFollowModelChan
   EXPECT_TRUE(QELIPertNodeExt_var(d)->GetHiddenFlag());
 }
 
+// The points of every link of the top level, in the order the chart holds them.
+std::vector<std::vector<VORMathPoint2Df>> LinkPoints(QELPertController& chart) {
+  std::vector<std::vector<VORMathPoint2Df>> points;
+  auto* links = static_cast<VOR2DBagRep*>(chart.GetChartRep()->GetChild(1));
+  for (int i = 1; i <= links->GetSize(); ++i) {
+    auto* link = static_cast<VOR2DCustomRep*>(links->GetChild(i));
+    for (int k = 1; k <= link->GetPrimitiveCount(); ++k)
+      points.push_back(static_cast<const VOR2DPolylineGP*>(link->GetPrimitive(k))->GetPoints());
+  }
+  return points;
+}
+
+TEST_F(ControllerTest, BatchedMovesRebuildEachLinkOnceWhereUnbatchedMovesPutIt) {
+  Build(false);
+  auto moveAll = [this](double dx) {
+    for (VORBaseUnknown_var* n : {&a, &b, &c, &d}) {
+      double x = 0.0, y = 0.0;
+      QELIPertNode_var(*n)->GetPosition(x, y);
+      QELIPertNode_var(*n)->SetPosition(x + dx, y);
+      controller->RefreshNodePositionInPert(*n, true);
+    }
+  };
+  unsigned long rebuilt = controller->GetLinkRebuildCount();
+  moveAll(10.0);
+  EXPECT_EQ(controller->GetLinkRebuildCount() - rebuilt, 8u) << "each of 4 links once per end";
+  const auto unbatched = LinkPoints(*controller);
+  moveAll(-10.0);
+
+  rebuilt = controller->GetLinkRebuildCount();
+  const int draws = viewer->GetDrawRequestCount();
+  controller->BeginMoves();
+  controller->BeginMoves();
+  moveAll(10.0);
+  controller->EndMoves();
+  EXPECT_EQ(controller->GetLinkRebuildCount(), rebuilt) << "nothing before the outer end";
+  controller->EndMoves();
+  EXPECT_EQ(controller->GetLinkRebuildCount() - rebuilt, 4u);
+  EXPECT_EQ(viewer->GetDrawRequestCount(), draws + 1);
+  EXPECT_EQ(LinkPoints(*controller), unbatched);
+
+  // A node taken out during a batch takes its due links with it.
+  controller->BeginMoves();
+  moveAll(5.0);
+  ASSERT_EQ(controller->RemoveChildNode(d), S_OK);
+  controller->EndMoves();
+  EXPECT_EQ(controller->GetLinkCount(), 2);
+
+  // Moving through the chart writes the document and names the root as the node's reference.
+  VORBaseUnknown* reference = nullptr;
+  EXPECT_EQ(controller->MoveNodeTo(e, 30.0, 40.0, false, reference), S_OK);
+  EXPECT_EQ(reference, root.Identity());
+  double x = 0.0, y = 0.0;
+  VORIGraphNodeLayout_var(e)->GetPertPosition(x, y);
+  EXPECT_EQ(x, 30.0);
+  EXPECT_EQ(y, 40.0);
+  EXPECT_EQ(controller->MoveNodeTo(d, 1.0, 1.0, false, reference), E_FAIL) << "not in the chart";
+}
+
 TEST_F(ControllerTest, DraggingABoxMovesTheNodeSnapsItAndNotifiesTheRoot) {
   Build(true);
   notes.Listen(root);
