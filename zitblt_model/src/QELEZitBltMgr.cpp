@@ -68,8 +68,10 @@ void QELEZitBltMgr::BuildZitBlts() {
     subscriber->Subscribe();
   if (!document)
     return;
-  for (const QELZitBltDefinition& d :
-       QELZitBltConfiguration::DefinitionsForActivity(document, activity)) {
+  const std::vector<QELZitBltDefinition>& definitions =
+      QELZitBltConfiguration::DefinitionsForActivity(document, activity);
+  _zitBlts.reserve(definitions.size());
+  for (const QELZitBltDefinition& d : definitions) {
     VORCommand* created = QELZitBltCommandFactory::CreateRep(d, activity);
     auto* rep = dynamic_cast<QELZitBltRep*>(created);
     if (rep == nullptr) {

@@ -136,6 +136,7 @@ class QELBaseScrollListZitBltRep : public QELZitBltRep {
  protected:
   ~QELBaseScrollListZitBltRep() override;
   void BeforeExpandedShown() override;
+  bool ButtonStartsGrey() const override { return _items.IsEmpty(); }
 
  private:
   // A hidden list that does not scroll is drawn when it is first shown or looked at: its item

@@ -99,6 +99,9 @@ class QELZitBltRep : public VORCommand {
   void SetTranslation(double x, double y);
   // Called just before the expanded bag is shown (opened, or shown by its status).
   virtual void BeforeExpandedShown() {}
+  // Whether BuildRep draws the button in grey from the start (an empty list) rather than in
+  // colour and then in grey.
+  virtual bool ButtonStartsGrey() const { return false; }
 
   int _btnState = 0;
   VOR2DBagRep_var _btnBag;

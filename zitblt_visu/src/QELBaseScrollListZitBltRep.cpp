@@ -154,7 +154,7 @@ void QELBaseScrollListZitBltRep::BuildRep(VORViewer* viewer) {
     _cso = CurrentCSO();
   if (!_items.IsEmpty()) {
     ReFreshZitBltReps(GetLocation());
-  } else {
+  } else if (!IsButtonGrey()) {
     SetZitbltButtonGrey(1);
   }
 }

@@ -170,7 +170,7 @@ void QELZitBltRep::BuildRep(VORViewer* viewer) {
     iso->AddElement(_expandedModel);
   }
 
-  SetZitbltButtonGrey(0);
+  SetZitbltButtonGrey(ButtonStartsGrey() ? 1 : 0);
   if (_collapsed)
     _expandedBag->SetShowMode(1);
 
