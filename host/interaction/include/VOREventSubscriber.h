@@ -45,6 +45,8 @@ class VOREventSubscriber : public VORBaseUnknown {
     VORCallbackId id;
   };
   static VORCommand* AsCommand(VORBaseUnknown* publisherOwner);
+  VORCallbackId Subscribe(VOREventPublisher* publisher, const std::string& name,
+                          VORCallbackFunction callback, void* clientData);
   std::vector<Subscription> _subscriptions;
 };
 
@@ -52,11 +54,14 @@ template <class C>
 VORCallbackId VOREventSubscriber::AddCallback(
     VOREventPublisher* publisher, const std::string& notificationName,
     void (C::*method)(VORCommand*, VORNotification*, void*), void* clientData) {
+  if (method == nullptr)
+    return 0;
   C* self = static_cast<C*>(this);
-  return AddCallback(
+  // Small enough to live inside the publisher's callback: no heap block per subscription.
+  return Subscribe(
       publisher, notificationName,
-      [self, method](VORBaseUnknown* owner, VORNotification* notification, void* data) {
-        (self->*method)(AsCommand(owner), notification, data);
-      },
+      [self, method](VORBaseUnknown* owner, const std::string&, VORNotification* notification,
+                     void* data,
+                     VORCallbackId) { (self->*method)(AsCommand(owner), notification, data); },
       clientData);
 }

@@ -12,14 +12,23 @@ VOREventSubscriber::~VOREventSubscriber() {
 VORCallbackId VOREventSubscriber::AddCallback(VOREventPublisher* publisher,
                                               const std::string& notificationName, Method method,
                                               void* clientData) {
-  if (publisher == nullptr || !method)
+  if (!method)
     return 0;
-  VORCallbackId id = publisher->AddCallback(
-      notificationName,
+  return Subscribe(
+      publisher, notificationName,
       [method = std::move(method)](VORBaseUnknown* owner, const std::string&,
                                    VORNotification* notification, void* data,
                                    VORCallbackId) { method(owner, notification, data); },
-      clientData, this);
+      clientData);
+}
+
+VORCallbackId VOREventSubscriber::Subscribe(VOREventPublisher* publisher, const std::string& name,
+                                            VORCallbackFunction callback, void* clientData) {
+  if (publisher == nullptr)
+    return 0;
+  const VORCallbackId id = publisher->AddCallback(name, std::move(callback), clientData, this);
+  if (_subscriptions.empty())
+    _subscriptions.reserve(4);  // a subscriber rarely holds fewer: one block, not three
   _subscriptions.push_back(Subscription{VORHandle<VOREventPublisher>(publisher), id});
   return id;
 }

@@ -42,9 +42,11 @@ void VORISO::Compact() {
 }
 
 bool VORISO::AddElement(VORBaseUnknown* model) {
-  if (model == nullptr || IsPresent(model))
+  if (model == nullptr)
     return false;
-  _slotOf.emplace(model->GetIdentity(), _slots.size());
+  // One look-up: a chart adds several models per node.
+  if (!_slotOf.try_emplace(model->GetIdentity(), _slots.size()).second)
+    return false;
   _slots.emplace_back(model);
   Invalidate();
   _publisher->Dispatch("VORISOAdd");

@@ -9,21 +9,14 @@
 // object does not visit the listeners of every other; a dispatch without key reaches them all.
 #pragma once
 
-#include <functional>
 #include <memory>
 #include <string>
 #include <string_view>
 #include <unordered_map>
 #include <vector>
 
+#include "VORCallbackFunction.h"
 #include "VORNotification.h"
-
-using VORCallbackId = unsigned int;  // 0 means none
-
-// publisher, event name, notification, client data, callback id
-using VORCallbackFunction =
-    std::function<void(VORBaseUnknown* publisher, const std::string& event,
-                       VORNotification* notification, void* clientData, VORCallbackId id)>;
 
 class VOREventPublisher : public VORBaseUnknown {
   VOR_DECLARE_CLASS(VOREventPublisher, VORBaseUnknown)

@@ -70,10 +70,17 @@ VORCallbackId VOREventPublisher::Add(const void* key, const std::string& name,
   }
   auto entry = std::make_shared<Entry>(
       Entry{++nextId, key, std::move(callback), clientData, subscriber, channel});
-  if (key != nullptr)
+  // Most publishers hold a handful of callbacks: one block for the first few, not one per
+  // doubling.
+  if (key != nullptr) {
     channel->byKey[key].push_back(entry);
-  else
+  } else {
+    if (channel->unkeyed.empty())
+      channel->unkeyed.reserve(4);
     channel->unkeyed.push_back(entry);
+  }
+  if (_live.empty())
+    _live.reserve(4);
   _live.push_back(std::move(entry));
   return _live.back()->id;
 }

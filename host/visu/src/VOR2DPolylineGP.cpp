@@ -3,11 +3,15 @@
 #include "VOR2DRep.h"
 
 VOR2DPolylineGP::VOR2DPolylineGP(const VORMathPoint2Df* points, int count, int mode) : _mode(mode) {
+  if (points != nullptr && count > 0)
+    _points.reserve(static_cast<size_t>(count));
   for (int i = 0; points != nullptr && i < count; ++i)
     _points.push_back(points[i]);
 }
 
 VOR2DPolylineGP::VOR2DPolylineGP(const float* xy, int count, int mode) : _mode(mode) {
+  if (xy != nullptr && count > 0)
+    _points.reserve(static_cast<size_t>(count));
   for (int i = 0; xy != nullptr && i < count; ++i)
     _points.emplace_back(xy[2 * i], xy[2 * i + 1]);
 }
