@@ -31,19 +31,6 @@ std::vector<VORMathPoint2Df> BoxPoints(double w, double h) {
   return {{-hw, -hh}, {hw, -hh}, {hw, hh}, {-hw, hh}};
 }
 
-// Arrow head at q pointing along x, barbs of length 2 at 18 degrees from the shaft.
-void ArrowHead(const VORMathPoint2Df& p, const VORMathPoint2Df& q, VORMathPoint2Df (&points)[3]) {
-  const float d = q.x >= p.x ? 1.0f : -1.0f;
-  const double angle = 2.82744;
-  const auto ax = static_cast<float>(d * std::cos(angle));
-  const auto ay = static_cast<float>(d * std::sin(angle));
-  const auto bx = static_cast<float>(d * std::cos(-angle));
-  const auto by = static_cast<float>(d * std::sin(-angle));
-  points[0] = {q.x + 2.0f * bx, q.y + 2.0f * by};
-  points[1] = q;
-  points[2] = {q.x + 2.0f * ax, q.y + 2.0f * ay};
-}
-
 }  // namespace
 
 QELPertController::QELPertController(VORFrmWindow* window, const VORBaseUnknown_var& root,
@@ -270,115 +257,6 @@ void QELPertController::PlaceNode(Node* node) {
     oy = node->level->ownerNode->y;
   }
   node->bag->SetMatrix(VOR3x3Matrix::Translation(node->x - ox, node->y - oy));
-}
-
-void QELPertController::AddLinksOf(Node* node) {
-  VORISPPFlowMgt* flow = node->flow.get();
-  if (flow == nullptr)
-    return;
-  auto link = [this](Node* from, Node* to) {
-    if (from == to || from->level != to->level)
-      return;
-    for (Link* existing : from->links) {
-      if (existing->from == from && existing->to == to)
-        return;
-    }
-    auto owned = std::make_unique<Link>();
-    Link* l = owned.get();
-    l->from = from;
-    l->to = to;
-    l->rep = VOR2DCustomRep_var::Adopt(new VOR2DCustomRep());
-    l->rep->SetTag("PertLink");
-    from->level->links->AddChild(l->rep);
-    from->level->linkList.push_back(std::move(owned));
-    from->links.push_back(l);
-    to->links.push_back(l);
-    UpdateLink(l);
-  };
-  VORListValVORBaseUnknown_var* next = nullptr;
-  if (SUCCEEDED(flow->GetNextActivities(next, "")) && next != nullptr) {
-    for (const VORBaseUnknown_var& n : *next) {
-      if (Node* other = Find(n))
-        link(node, other);
-    }
-  }
-  delete next;
-  VORListValVORBaseUnknown_var* previous = nullptr;
-  if (SUCCEEDED(flow->GetPreviousActivities(previous, "")) && previous != nullptr) {
-    for (const VORBaseUnknown_var& p : *previous) {
-      if (Node* other = Find(p))
-        link(other, node);
-    }
-  }
-  delete previous;
-}
-
-void QELPertController::UpdateLink(Link* link) {
-  double ox = 0.0;
-  double oy = 0.0;
-  if (link->from->level->ownerNode != nullptr) {
-    ox = link->from->level->ownerNode->x;
-    oy = link->from->level->ownerNode->y;
-  }
-  const Node* a = link->from;
-  const Node* b = link->to;
-  // From the right edge of the source to the left edge of the target; mirrored when the
-  // target lies to the left.
-  const bool forward = b->x >= a->x;
-  const double side = forward ? 1.0 : -1.0;
-  const VORMathPoint2Df p(static_cast<float>(a->x - ox + side * a->w * 0.5),
-                          static_cast<float>(a->y - oy));
-  const VORMathPoint2Df q(static_cast<float>(b->x - ox - side * b->w * 0.5),
-                          static_cast<float>(b->y - oy));
-  const auto m = static_cast<float>((p.x + q.x) * 0.5);
-  const VORMathPoint2Df route[4] = {p, {m, p.y}, {m, q.y}, q};
-  VORMathPoint2Df head[3];
-  ArrowHead(p, q, head);
-  ++_linkRebuilds;
-  // A link drawn before keeps its two polylines: only their points change.
-  if (link->rep->GetPrimitiveCount() == 2 && link->rep->ModifyPolyline(1, route, 4) &&
-      link->rep->ModifyPolyline(2, head, 3))
-    return;
-  const std::uint32_t word =
-      VOR2DGraphicAttribute::Pack(QELPertParameters::LinkColor, 4, 1, 4, false, true);
-  link->rep->RemoveAllPrimitives();
-  link->rep->AddPrimitive(new VOR2DPolylineGP(route, 4, 1), word, 255);
-  link->rep->AddPrimitive(new VOR2DPolylineGP(head, 3, 1), word, 255);
-}
-
-void QELPertController::RefreshLink(Link* link) {
-  if (_moveBatches == 0) {
-    UpdateLink(link);
-    return;
-  }
-  if (!link->due) {
-    link->due = true;
-    _dueLinks.push_back(link);
-  }
-}
-
-void QELPertController::ForgetDueLink(Link* link) {
-  if (link->due)
-    std::erase(_dueLinks, link);
-  link->due = false;
-}
-
-void QELPertController::BeginMoves() {
-  ++_moveBatches;
-}
-
-void QELPertController::EndMoves() {
-  if (_moveBatches == 0 || --_moveBatches > 0)
-    return;
-  std::vector<Link*> due;
-  due.swap(_dueLinks);
-  for (Link* link : due) {
-    link->due = false;
-    UpdateLink(link);
-  }
-  if (_drawDue && _viewer)
-    _viewer->Draw();
-  _drawDue = false;
 }
 
 void QELPertController::Announce(VORBaseUnknown* node, int removeRep) {
@@ -632,22 +510,6 @@ void QELPertController::RemoveAllPertNodes() {
 void QELPertController::RemoveNodeManipCmdCB() {
   if (_manipulator)
     RemoveCallbacksOn(_manipulator->GetEventPublisher());
-}
-
-void QELPertController::RefreshLinks() {
-  std::vector<Level*> levels{_top.get()};
-  for (auto& [key, node] : _nodes) {
-    node->links.clear();
-    if (node->inner)
-      levels.push_back(node->inner.get());
-  }
-  _dueLinks.clear();
-  for (Level* level : levels) {
-    level->linkList.clear();
-    level->links->EmptyBag();
-  }
-  for (auto& [key, node] : _nodes)
-    AddLinksOf(node.get());
 }
 
 void QELPertController::FollowModel(Node* node) {
