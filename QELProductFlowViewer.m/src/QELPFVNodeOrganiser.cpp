@@ -225,6 +225,36 @@ void QELPFVNodeOrganiser::SetNodePosition(VORBaseUnknown_var& node,
     ext->SetPosition(x, y, 1);
 }
 
+// One column, top down from (x, y): each node snapped, then the next one yStep lower. A node the
+// chart shows moves through the chart, which holds its interfaces; a node moves() refuses keeps
+// its place but still takes its slot.
+template <class Moves>
+void QELPFVNodeOrganiser::PlaceColumn(VORListValVORBaseUnknown_var& list, double& x, double& y,
+                                      float yStep, Moves moves) {
+  const QELIPertNode_var noNode;
+  for (VORBaseUnknown_var& node : list) {
+    const bool move = moves(node);
+    double snappedX = x;
+    double snappedY = y;
+    QELPertClientVisuServices::CalculateSnapPositionInPert(snappedX, snappedY, 1, noNode);
+    if (move && MoveThroughChart(node, snappedX, snappedY)) {
+      x = snappedX;
+      y = snappedY + yStep;
+      continue;
+    }
+    const QELIPertNode_var pertNode(node);
+    if (!pertNode)
+      continue;
+    x = snappedX;
+    y = snappedY;
+    if (move) {
+      SetNodePosition(node, pertNode, x, y);
+      Announce(node, pertNode);
+    }
+    y += yStep;
+  }
+}
+
 bool QELPFVNodeOrganiser::ArrangeNodes(VORBaseUnknown_var root, QELPertController* controller) {
   Trace().TraPrint("QELPFVNodeOrganiser::ArrangeNodes -->");
   if (!root || controller == nullptr)
@@ -251,7 +281,6 @@ bool QELPFVNodeOrganiser::ArrangeNodes(VORBaseUnknown_var root, QELPertControlle
     if (QELIPertNode_var rootPert(root); rootPert)
       rootPert->GetPosition(x, y, 1);
   }
-  const QELIPertNode_var noNode;
   {
     const MoveBatch batch(_controller);
     for (VORListValVORBaseUnknown_var* list : *_levelLists) {
@@ -261,25 +290,7 @@ bool QELPFVNodeOrganiser::ArrangeNodes(VORBaseUnknown_var root, QELPertControlle
         yStep = side / static_cast<float>(count);
         y = side / static_cast<float>(2 * count);
       }
-      for (VORBaseUnknown_var& node : *list) {
-        // A node the chart shows moves through the chart, which holds its interfaces.
-        double snappedX = x;
-        double snappedY = y;
-        QELPertClientVisuServices::CalculateSnapPositionInPert(snappedX, snappedY, 1, noNode);
-        if (MoveThroughChart(node, snappedX, snappedY)) {
-          x = snappedX;
-          y = snappedY + yStep;
-          continue;
-        }
-        const QELIPertNode_var pertNode(node);
-        if (!pertNode)
-          continue;
-        x = snappedX;
-        y = snappedY;
-        SetNodePosition(node, pertNode, x, y);
-        y += yStep;
-        Announce(node, pertNode);
-      }
+      PlaceColumn(*list, x, y, yStep, [](const VORBaseUnknown_var&) { return true; });
       x += xStep;
     }
   }
@@ -353,7 +364,6 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
   sortedIndex.reserve(static_cast<size_t>(n));
   for (int p = 1; p <= n; ++p)
     sortedIndex.emplace((*_childNodeList)[p].Identity(), p);
-  const QELIPertNode_var noNode;
   for (VORBaseUnknown_var& newNode : *newNodes) {
     // What moves: the new node and everything downstream of it (the change list, as a set).
     std::unordered_set<VORBaseUnknown*> change;
@@ -402,27 +412,9 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
           y = side / static_cast<float>(2 * count);
         }
         x += xStep;
-        for (VORBaseUnknown_var& node : *list) {
-          const bool moves = change.count(node.Identity()) != 0;
-          double snappedX = x;
-          double snappedY = y;
-          QELPertClientVisuServices::CalculateSnapPositionInPert(snappedX, snappedY, 1, noNode);
-          if (moves && MoveThroughChart(node, snappedX, snappedY)) {
-            x = snappedX;
-            y = snappedY + yStep;
-            continue;
-          }
-          const QELIPertNode_var pertNode(node);
-          if (!pertNode)
-            continue;
-          x = snappedX;
-          y = snappedY;
-          if (moves) {
-            SetNodePosition(node, pertNode, x, y);
-            Announce(node, pertNode);
-          }
-          y += yStep;
-        }
+        PlaceColumn(*list, x, y, yStep, [&change](const VORBaseUnknown_var& node) {
+          return change.count(node.Identity()) != 0;
+        });
       }
     }
     _controller->GetViewer()->Reframe();

@@ -57,6 +57,9 @@ class QELPFVNodeOrganiser : public VORCommand {
   // SetNodePosition and Announce for a node the chart shows, through the interfaces the chart
   // holds; false, and nothing done, for a node it does not show.
   bool MoveThroughChart(VORBaseUnknown_var& node, double x, double y);
+  template <class Moves>
+  void PlaceColumn(VORListValVORBaseUnknown_var& list, double& x, double& y, float yStep,
+                   Moves moves);
   // The position notification on the reference object's model events.
   void NotifyMove(VORBaseUnknown_var& node, const VORBaseUnknown_var& reference, double x,
                   double y);
