@@ -31,12 +31,7 @@ struct Place {
 
 class ChartWindowTest : public ::testing::Test {
  protected:
-  void SetUp() override {
-    window = std::make_unique<VORQtMainWindow>();
-    window->resize(1400, 880);
-    window->show();
-    QApplication::processEvents();
-  }
+  void SetUp() override { window = ShowMainWindow(); }
   void TearDown() override {
     window.reset();
     QApplication::processEvents();

@@ -25,10 +25,7 @@ namespace {
 class ItemDragWindowTest : public ::testing::Test {
  protected:
   void SetUp() override {
-    window = std::make_unique<VORQtMainWindow>();
-    window->resize(1400, 880);
-    window->show();
-    QApplication::processEvents();
+    window = ShowMainWindow();
     widget = OpenSampleInViewer(*window);
     ASSERT_NE(widget, nullptr);
   }

@@ -9,11 +9,21 @@
 #include <QTest>
 #include <QTimer>
 #include <cstdlib>
+#include <memory>
 #include <string>
 
 #include "VORQtDocumentTree.h"
 #include "VORQtMainWindow.h"
 #include "VORQtViewerWidget.h"
+
+// A main window at the size the window tests' coordinates assume, shown and settled.
+inline std::unique_ptr<VORQtMainWindow> ShowMainWindow() {
+  auto window = std::make_unique<VORQtMainWindow>();
+  window->resize(1400, 880);
+  window->show();
+  QApplication::processEvents();
+  return window;
+}
 
 inline std::string SamplePath() {
   const char* dir = std::getenv("PFV_EXAMPLES");
