@@ -209,12 +209,15 @@ void QELFpaProductFlowViewer::UpdateGraph(VORBaseUnknown_var& root, VORBaseUnkno
   QELIPertPosition_var ParentNode(root);
   VOR_ASSERT_AT(NULL_var != ParentNode, kModule, 1216);
   VORListValVORBaseUnknown_var* nodes = GetProductFlowViewerNodes(root);
+  // One batch: each link is drawn once, when the whole level is in, not once per end added.
+  _controller->BeginMoves();
   for (VORBaseUnknown_var& node : *nodes) {
     if (!node || (excluded != nullptr && node.Identity() == excluded->GetIdentity()))
       continue;
     _controller->AddChildNode(node);
     _controller->RefreshNodePositionInPert(node, false);
   }
+  _controller->EndMoves();
   delete nodes;
 }
 

@@ -1,6 +1,7 @@
 #include "QELPFVNodeOrganiser.h"
 
 #include <algorithm>
+#include <string>
 #include <unordered_map>
 #include <unordered_set>
 
@@ -28,6 +29,12 @@ const VORTrace& Trace() {
 }
 
 constexpr const char* kCatalog = "QELFpaProductFlowViewer";
+
+// Traced once per moved node: kept as a string rather than built from the literal each time.
+const std::string& DispatchNotifLine() {
+  static const std::string line = "QELPFVNodeOrganiser::DispatchNotif -->";
+  return line;
+}
 
 // The chart rebuilds each link once when the layout is done, not once per moved end.
 class MoveBatch {
@@ -89,19 +96,14 @@ void QELPFVNodeOrganiser::GenerateNodeIndexes() {
   _successors.assign(static_cast<size_t>(n), {});
   for (int i = 1; i <= n; ++i) {
     VORISPPFlowMgt_var flows((*_childNodeList)[i]);
-    VORListValVORBaseUnknown_var* next = nullptr;
-    if (!flows || FAILED(flows->GetNextActivities(next, "Activity")) || next == nullptr) {
-      delete next;
+    if (!flows)
       continue;
-    }
     std::vector<int>& succ = _successors[static_cast<size_t>(i - 1)];
-    succ.reserve(static_cast<size_t>(next->Size()));
-    for (const VORBaseUnknown_var& s : *next) {
-      auto it = index.find(s.Identity());
+    flows->ForEachNextActivity([&](VORBaseUnknown* s) {
+      auto it = index.find(s->GetIdentity());
       if (it != index.end())
         succ.push_back(it->second);
-    }
-    delete next;
+    });
   }
   // The walk itself (raising successors, reporting nodes met again) runs on the indexes.
   const QELPFVLayoutCore::Levels levels = QELPFVLayoutCore::ComputeLevels(_successors);
@@ -427,7 +429,7 @@ void QELPFVNodeOrganiser::DispatchNotif(VORBaseUnknown_var node) {
 }
 
 void QELPFVNodeOrganiser::Announce(VORBaseUnknown_var& node, const QELIPertNode_var& pertNode) {
-  Trace().TraPrint("QELPFVNodeOrganiser::DispatchNotif -->");
+  Trace().TraPrint(DispatchNotifLine());
   if (!node)
     return;
   double x = 0.0;
@@ -448,7 +450,7 @@ bool QELPFVNodeOrganiser::MoveThroughChart(VORBaseUnknown_var& node, double x, d
   VORBaseUnknown* known = nullptr;
   if (_controller == nullptr || _controller->MoveNodeTo(node, x, y, true, known) != S_OK)
     return false;
-  Trace().TraPrint("QELPFVNodeOrganiser::DispatchNotif -->");
+  Trace().TraPrint(DispatchNotifLine());
   VORBaseUnknown_var reference(known);
   if (!reference) {
     QELIPertPosition_var position(node);

@@ -2,6 +2,8 @@
 // Control nodes answer the flow part; their product IO calls fail with E_NOTIMPL.
 #pragma once
 
+#include <type_traits>
+
 #include "VORHandle.h"
 #include "VORLists.h"
 
@@ -14,6 +16,16 @@ class VORISPPFlowMgt : public virtual VORBaseUnknown {
                                         const char* filter = "Activity") = 0;
   virtual HRESULT GetNextActivities(VORListValVORBaseUnknown_var*& next,
                                     const char* filter = "Activity") = 0;
+  // The same nodes in the same order, handed one by one to visit without building a list: for
+  // callers that walk the flows of every node of a level. visit must not change the flows.
+  template <class Visit>
+  void ForEachPreviousActivity(Visit&& visit, const char* filter = "Activity") {
+    VisitActivities(false, &CallVisit<Visit>, &visit, filter);
+  }
+  template <class Visit>
+  void ForEachNextActivity(Visit&& visit, const char* filter = "Activity") {
+    VisitActivities(true, &CallVisit<Visit>, &visit, filter);
+  }
   // Links this -> next. E_INVALIDARG when next is not a sibling graph node or is this node;
   // S_FALSE (no change) when the link exists.
   virtual HRESULT AddNextActivity(VORBaseUnknown* next) = 0;
@@ -33,5 +45,24 @@ class VORISPPFlowMgt : public virtual VORBaseUnknown {
   // their input.
   // Emits kind 29.
   virtual HRESULT RemoveProductIO(VORBaseUnknown* productIO) = 0;
+
+ protected:
+  // next: the next activities, else the previous ones. The default walks the new list.
+  virtual void VisitActivities(bool next, void (*visit)(void*, VORBaseUnknown*), void* context,
+                               const char* filter) {
+    VORListValVORBaseUnknown_var* list = nullptr;
+    if (SUCCEEDED(next ? GetNextActivities(list, filter) : GetPreviousActivities(list, filter)) &&
+        list != nullptr) {
+      for (const VORBaseUnknown_var& node : *list)
+        visit(context, node.get());
+    }
+    delete list;
+  }
+
+ private:
+  template <class Visit>
+  static void CallVisit(void* context, VORBaseUnknown* node) {
+    (*static_cast<std::remove_reference_t<Visit>*>(context))(node);
+  }
 };
 VOR_DECLARE_HANDLE(VORISPPFlowMgt);

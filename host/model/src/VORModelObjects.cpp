@@ -201,6 +201,14 @@ HRESULT VORGraphNodeImpl::GetNextActivities(VORListValVORBaseUnknown_var*& list,
   return FlowList(next, list, filter);
 }
 
+void VORGraphNodeImpl::VisitActivities(bool toNext, void (*visit)(void*, VORBaseUnknown*),
+                                       void* context, const char* filter) {
+  for (const VORFlowRef& r : toNext ? next : previous) {
+    if (VORMatchesFilter(r.node, filter))
+      visit(context, static_cast<VORIGENode*>(r.node));
+  }
+}
+
 HRESULT VORGraphNodeImpl::AddNextActivity(VORBaseUnknown* nextNode) {
   auto* door = DoorOf(this);
   return door ? door->AddFlow(static_cast<VORIGENode*>(this), nextNode) : E_FAIL;

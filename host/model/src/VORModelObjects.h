@@ -131,6 +131,8 @@ class VORGraphNodeImpl : public VORModelObject,
   HRESULT AddProductInput(VORBaseUnknown* item, VORBaseUnknown_var& productInput) override;
   HRESULT AddProductOutput(VORBaseUnknown* item, VORBaseUnknown_var& productOutput) override;
   HRESULT RemoveProductIO(VORBaseUnknown* productIO) override;
+  void VisitActivities(bool toNext, void (*visit)(void*, VORBaseUnknown*), void* context,
+                       const char* filter) override;
 
   virtual VORActivityImpl* AsActivity() { return nullptr; }
   int IndexInFather() const;

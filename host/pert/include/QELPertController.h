@@ -10,6 +10,7 @@
 #include <unordered_map>
 #include <vector>
 
+#include "QELPertInlineList.h"
 #include "QELPertParameters.h"
 #include "VOR2DBagRep.h"
 #include "VOR2DCustomRep.h"
@@ -102,7 +103,7 @@ class QELPertController : public VORCommand {
     VOR2DBagRep_var bag;
     Level* level = nullptr;        // the level the node is drawn in
     std::unique_ptr<Level> inner;  // set while the inner chart is shown
-    std::vector<Link*> links;
+    QELPertInlineList<Link*, 2> links;
     double x = 0.0;  // chart position
     double y = 0.0;
     double w = 0.0;
@@ -162,7 +163,8 @@ class QELPertController : public VORCommand {
   bool _editable;
   VOR2DBagRep_var _chart;
   std::unique_ptr<Level> _top;
-  std::unordered_map<VORBaseUnknown*, std::unique_ptr<Node>> _nodes;
+  // Nodes live in the map itself (its entries never move): one heap block per node, not two.
+  std::unordered_map<VORBaseUnknown*, Node> _nodes;
   VOR2DManipulator_var _manipulator;
   double _dragStartX = 0.0;
   double _dragStartY = 0.0;

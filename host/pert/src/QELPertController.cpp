@@ -91,7 +91,8 @@ void QELPertController::SetWindowRootNode(VORBaseUnknown* root, VORBaseUnknown_v
 
 QELPertController::Node* QELPertController::Find(VORBaseUnknown* node) const {
   auto it = _nodes.find(Key(node));
-  return it == _nodes.end() ? nullptr : it->second.get();
+  // As with the owning pointers the map held before: finding a node does not freeze it.
+  return it == _nodes.end() ? nullptr : const_cast<Node*>(&it->second);
 }
 
 bool QELPertController::IsInChart(VORBaseUnknown* node) const {
@@ -106,7 +107,7 @@ VOR2DBagRep* QELPertController::GetNodeRep(VORBaseUnknown* node) const {
 int QELPertController::GetLinkCount() const {
   size_t ends = 0;
   for (const auto& [key, node] : _nodes)
-    ends += node->links.size();
+    ends += node.links.size();
   return static_cast<int>(ends / 2);
 }
 
@@ -140,15 +141,13 @@ HRESULT QELPertController::AddChildNode(VORBaseUnknown_var& node) {
 }
 
 QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Level* level) {
-  auto owned = std::make_unique<Node>();
-  Node* node = owned.get();
+  Node* node = &_nodes.try_emplace(Key(object)).first->second;
   node->object = Key(object);
   node->level = level;
   node->graph = VORIGENode_var(node->object);
   node->layout = VORIGraphNodeLayout_var(node->object);
   node->flow = VORISPPFlowMgt_var(node->object);
   node->ext = QELEPertNodeExt::Of(node->object);
-  _nodes.emplace(Key(object), std::move(owned));
   level->members.push_back(node);
   ReadPosition(node);
   FollowModel(node);
@@ -156,8 +155,8 @@ QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Leve
   node->bag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
   node->bag->SetTag("PertNode");
   node->bag->SetObject(node->object);
-  const std::vector<VORMathPoint2Df> empty = BoxPoints(0.0, 0.0);
-  auto box = VORHandle<VOR2DPolygonRep>::Adopt(new VOR2DPolygonRep(empty, 1));
+  // No points yet: BuildShape gives the box its size.
+  auto box = VORHandle<VOR2DPolygonRep>::Adopt(new VOR2DPolygonRep(nullptr, 0, 1));
   // Filled by the kind of activity, so that a station is told from a loading at a glance.
   VORISPPActivity_var activity(node->object);
   box->SetFillColorIndex(
@@ -412,9 +411,9 @@ void QELPertController::RemoveNode(Node* node, bool announce) {
   }
   // Links touching the node go from both ends and from their level.
   Level* level = node->level;
-  for (Link* link : std::vector<Link*>(node->links)) {
+  for (Link* link : std::vector<Link*>(node->links.begin(), node->links.end())) {
     Node* other = link->from == node ? link->to : link->from;
-    std::erase(other->links, link);
+    other->links.Remove(link);
     ForgetDueLink(link);
     level->links->RemoveChild(link->rep);
     std::erase_if(level->linkList, [link](const auto& l) { return l.get() == link; });
@@ -483,8 +482,8 @@ HRESULT QELPertController::RemoveChildNode(VORBaseUnknown_var& object) {
 
 void QELPertController::ClearChart() {
   for (auto& [key, node] : _nodes) {
-    UnfollowModel(node.get());
-    if (QELEPertNodeExt* ext = node->ext) {
+    UnfollowModel(&node);
+    if (QELEPertNodeExt* ext = node.ext) {
       ext->SetReference(nullptr);
       ext->SetDrawnSize(0.0, 0.0);
       ext->SetHiddenFlag(false);

@@ -44,24 +44,22 @@ void QELPertController::AddLinksOf(Node* node) {
     from->level->linkList.push_back(std::move(owned));
     from->links.push_back(l);
     to->links.push_back(l);
-    UpdateLink(l);
+    // Within a batch (a chart being filled) the link is drawn once, when its ends are placed.
+    RefreshLink(l);
   };
-  VORListValVORBaseUnknown_var* next = nullptr;
-  if (SUCCEEDED(flow->GetNextActivities(next, "")) && next != nullptr) {
-    for (const VORBaseUnknown_var& n : *next) {
-      if (Node* other = Find(n))
-        link(node, other);
-    }
-  }
-  delete next;
-  VORListValVORBaseUnknown_var* previous = nullptr;
-  if (SUCCEEDED(flow->GetPreviousActivities(previous, "")) && previous != nullptr) {
-    for (const VORBaseUnknown_var& p : *previous) {
-      if (Node* other = Find(p))
-        link(other, node);
-    }
-  }
-  delete previous;
+  // Visited in place: a list per node and direction would be allocated for nothing.
+  flow->ForEachNextActivity(
+      [&](VORBaseUnknown* n) {
+        if (Node* other = Find(n))
+          link(node, other);
+      },
+      "");
+  flow->ForEachPreviousActivity(
+      [&](VORBaseUnknown* p) {
+        if (Node* other = Find(p))
+          link(other, node);
+      },
+      "");
 }
 
 void QELPertController::UpdateLink(Link* link) {
@@ -135,9 +133,9 @@ void QELPertController::EndMoves() {
 void QELPertController::RefreshLinks() {
   std::vector<Level*> levels{_top.get()};
   for (auto& [key, node] : _nodes) {
-    node->links.clear();
-    if (node->inner)
-      levels.push_back(node->inner.get());
+    node.links.clear();
+    if (node.inner)
+      levels.push_back(node.inner.get());
   }
   _dueLinks.clear();
   for (Level* level : levels) {
@@ -145,5 +143,5 @@ void QELPertController::RefreshLinks() {
     level->links->EmptyBag();
   }
   for (auto& [key, node] : _nodes)
-    AddLinksOf(node.get());
+    AddLinksOf(&node);
 }
