@@ -158,6 +158,12 @@ std::vector<std::vector<int>> LevelLists(const Successors& successors,
     return lists;
   const int highest = level[static_cast<size_t>(order.back())];
   lists.resize(static_cast<size_t>(highest) + 1);
+  // Each list holds at most the nodes of its level: sized once.
+  std::vector<int> count(lists.size(), 0);
+  for (int l : level)
+    ++count[static_cast<size_t>(l)];
+  for (size_t v = 0; v < lists.size(); ++v)
+    lists[v].reserve(static_cast<size_t>(count[v]));
   // Only the first list keeps the sorted order: every later one is rebuilt below.
   for (int node : order) {
     if (level[static_cast<size_t>(node)] == 0)

@@ -1,6 +1,7 @@
 #include "QELPFVNodeOrganiser.h"
 
 #include <algorithm>
+#include <memory_resource>
 #include <string>
 #include <unordered_map>
 #include <unordered_set>
@@ -88,8 +89,10 @@ void QELPFVNodeOrganiser::GenerateNodeIndexes() {
   if (_childNodeList == nullptr || _childNodeList->Size() != _levelList->Size())
     return;
   const int n = _childNodeList->Size();
-  // Index of each child (its first occurrence), by object identity.
-  std::unordered_map<VORBaseUnknown*, int> index;
+  // Index of each child (its first occurrence), by object identity; its entries come from one
+  // growing buffer rather than a heap block each.
+  std::pmr::monotonic_buffer_resource entries;
+  std::pmr::unordered_map<VORBaseUnknown*, int> index(&entries);
   index.reserve(static_cast<size_t>(n));
   for (int i = 1; i <= n; ++i)
     index.emplace((*_childNodeList)[i].Identity(), i - 1);
@@ -149,7 +152,11 @@ void QELPFVNodeOrganiser::CreateListOfLists() {
   int p = 1;
   for (int v = 0; v <= highest; ++v) {
     auto* list = new VORListValVORBaseUnknown_var;
-    while (p <= n && (*_levelList)[p] == v)
+    int end = p;
+    while (end <= n && (*_levelList)[end] == v)
+      ++end;
+    list->Reserve(end - p);
+    while (p < end)
       list->Append((*_childNodeList)[p++]);
     _levelLists->Append(list);
   }
@@ -362,7 +369,8 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
     return true;
 
   const int n = _childNodeList->Size();
-  std::unordered_map<VORBaseUnknown*, int> sortedIndex;
+  std::pmr::monotonic_buffer_resource entries;
+  std::pmr::unordered_map<VORBaseUnknown*, int> sortedIndex(&entries);
   sortedIndex.reserve(static_cast<size_t>(n));
   for (int p = 1; p <= n; ++p)
     sortedIndex.emplace((*_childNodeList)[p].Identity(), p);
@@ -471,9 +479,7 @@ void QELPFVNodeOrganiser::NotifyMove(VORBaseUnknown_var& node, const VORBaseUnkn
   }
   if (!_events)
     return;
-  auto notification =
-      VORHandle<QELPertPositionNotify>::Adopt(new QELPertPositionNotify(node, x, y));
-  _events->Dispatch(notification);
+  _moved.Dispatch(*_events, node, x, y);
 }
 
 void QELPFVNodeOrganiser::DisplayCyclicWarningDialog() {

@@ -8,6 +8,7 @@
 
 #include "QELIPertNode.h"
 #include "QELPertController.h"
+#include "QELPertNotifications.h"
 #include "VORIModelEvents.h"
 #include "VORCommand.h"
 #include <vector>
@@ -79,6 +80,7 @@ class QELPFVNodeOrganiser : public VORCommand {
   // The model events of the last reference object announced to.
   VORBaseUnknown* _eventsOf = nullptr;
   VORIModelEvents_var _events;
+  QELPertNotifySlot<QELPertPositionNotify> _moved;
 };
 
 // For programs that load the module by name (VORModuleLoader::FindSymbol): lays out the

@@ -3,7 +3,7 @@
 // that names them.
 #pragma once
 
-#include <string>
+#include <string_view>
 #include <vector>
 
 struct QELPertActivityKind {
@@ -14,8 +14,8 @@ struct QELPertActivityKind {
 namespace QELPertActivityColors {
 // The kind of an activity type ("BIWActivityStation" ...); "Other" for control nodes and
 // unknown types.
-const QELPertActivityKind& KindOf(const std::string& activityType);
-int FillColorOf(const std::string& activityType);
+const QELPertActivityKind& KindOf(std::string_view activityType);
+int FillColorOf(std::string_view activityType);
 // Every kind, in legend order.
 const std::vector<QELPertActivityKind>& Legend();
 }  // namespace QELPertActivityColors

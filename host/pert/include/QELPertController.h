@@ -6,11 +6,14 @@
 // dispatches QELPertPositionNotify there (during the drag and, snapped, at its end).
 #pragma once
 
+#include <list>
 #include <memory>
+#include <memory_resource>
 #include <unordered_map>
 #include <vector>
 
 #include "QELPertInlineList.h"
+#include "QELPertNotifications.h"
 #include "QELPertParameters.h"
 #include "VOR2DBagRep.h"
 #include "VOR2DCustomRep.h"
@@ -112,19 +115,20 @@ class QELPertController : public VORCommand {
     VORHandle<VOREventPublisher> events;
     VORCallbackId moved = 0;
   };
-  struct Level {
-    VORBaseUnknown* owner = nullptr;  // root or super node (not held)
-    Node* ownerNode = nullptr;        // null for the root level
-    VOR2DBagRep_var links;
-    VOR2DBagRep_var nodes;
-    std::vector<Node*> members;
-    std::vector<std::unique_ptr<Link>> linkList;
-  };
   struct Link {
     Node* from = nullptr;
     Node* to = nullptr;
     VOR2DCustomRep_var rep;
     bool due = false;  // in _dueLinks: to be rebuilt at EndMoves
+  };
+  struct Level {
+    explicit Level(std::pmr::memory_resource* pool) : linkList(pool) {}
+    VORBaseUnknown* owner = nullptr;  // root or super node (not held)
+    Node* ownerNode = nullptr;        // null for the root level
+    VOR2DBagRep_var links;
+    VOR2DBagRep_var nodes;
+    std::vector<Node*> members;
+    std::pmr::list<Link> linkList;  // links never move once made
   };
 
   Node* Find(VORBaseUnknown* node) const;
@@ -158,13 +162,16 @@ class QELPertController : public VORCommand {
   VORViewer_var _viewer;  // held: the chart rep must be taken out of it at the end
   VORBaseUnknown_var _root;
   VORIModelEvents_var _rootEvents;
+  QELPertNotifySlot<QELPertAppInfoNotify> _announced;
   ViewerName _name;
   ViewerMode _mode;
   bool _editable;
   VOR2DBagRep_var _chart;
+  // Nodes and links are drawn from a pool: a chart of many nodes makes few heap blocks.
+  std::pmr::unsynchronized_pool_resource _pool;
   std::unique_ptr<Level> _top;
-  // Nodes live in the map itself (its entries never move): one heap block per node, not two.
-  std::unordered_map<VORBaseUnknown*, Node> _nodes;
+  // Nodes live in the map itself (its entries never move).
+  std::pmr::unordered_map<VORBaseUnknown*, Node> _nodes{&_pool};
   VOR2DManipulator_var _manipulator;
   double _dragStartX = 0.0;
   double _dragStartY = 0.0;
@@ -172,4 +179,5 @@ class QELPertController : public VORCommand {
   std::vector<Link*> _dueLinks;
   bool _drawDue = false;
   unsigned long _linkRebuilds = 0;
+  VORUnicodeString _label;  // BuildShape's label text
 };

@@ -21,7 +21,7 @@ const std::vector<QELPertActivityKind>& Legend() {
   return legend;
 }
 
-const QELPertActivityKind& KindOf(const std::string& type) {
+const QELPertActivityKind& KindOf(std::string_view type) {
   const auto& legend = Legend();
   if (type == "BIWActivityStation")
     return legend[0];
@@ -30,12 +30,12 @@ const QELPertActivityKind& KindOf(const std::string& type) {
   if (type == "BIWActivityGrouping")
     return legend[3];
   // Every other body-in-white operation joins parts (welding, clinching, gluing, sealing...).
-  if (type.rfind("BIWActivity", 0) == 0 && type != "BIWActivityRoot")
+  if (type.starts_with("BIWActivity") && type != "BIWActivityRoot")
     return legend[2];
   return legend[4];
 }
 
-int FillColorOf(const std::string& type) {
+int FillColorOf(std::string_view type) {
   return KindOf(type).colorIndex;
 }
 

@@ -44,7 +44,7 @@ QELPertController::QELPertController(VORFrmWindow* window, const VORBaseUnknown_
       _editable(editable) {
   _chart = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
   _chart->SetTag("PertChart");
-  _top = std::make_unique<Level>();
+  _top = std::make_unique<Level>(&_pool);
   _top->links = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
   _top->nodes = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
   _chart->AddChild(_top->links);
@@ -159,8 +159,9 @@ QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Leve
   auto box = VORHandle<VOR2DPolygonRep>::Adopt(new VOR2DPolygonRep(nullptr, 0, 1));
   // Filled by the kind of activity, so that a station is told from a loading at a glance.
   VORISPPActivity_var activity(node->object);
+  // The activity type is the late type (VORISPPActivity), read here without a copy.
   box->SetFillColorIndex(
-      QELPertActivityColors::FillColorOf(activity ? activity->GetActivityType().str() : ""));
+      QELPertActivityColors::FillColorOf(activity ? node->object->GetLateType() : ""));
   box->SetColorIndex(QELPertParameters::NodeBorderColor);
   node->bag->AddChild(box);
   auto label = VORHandle<VOR2DTextRep>::Adopt(new VOR2DTextRep(
@@ -190,7 +191,10 @@ void QELPertController::BuildShape(Node* node) {
   const double labelHeight = QELPertParameters::PERT_LABEL_HEIGHT;
   auto* box = static_cast<VOR2DPolygonRep*>(node->bag->GetChild(1));
   auto* label = static_cast<VOR2DTextRep*>(node->bag->GetChild(2));
-  VORUnicodeString text;
+  // Read into one string kept for every node: a copy assignment reuses its buffer.
+  static const VORUnicodeString noLabel;
+  VORUnicodeString& text = _label;
+  text = noLabel;
   if (node->graph)
     node->graph->GetLabel(text);
   label->SetText(text);
@@ -262,9 +266,7 @@ void QELPertController::Announce(VORBaseUnknown* node, int removeRep) {
   VORIModelEvents* events = _rootEvents.get();
   if (events == nullptr)
     return;
-  auto notification = VORHandle<QELPertAppInfoNotify>::Adopt(
-      new QELPertAppInfoNotify(VORBaseUnknown_var(node), nullptr, removeRep));
-  events->Dispatch(notification);
+  _announced.Dispatch(*events, VORBaseUnknown_var(node), nullptr, removeRep);
 }
 
 void QELPertController::DispatchPosition(Node* node) {
@@ -353,7 +355,7 @@ HRESULT QELPertController::ShowInnerNodes(VORBaseUnknown* superNode) {
     delete children;
     return E_FAIL;
   }
-  auto level = std::make_unique<Level>();
+  auto level = std::make_unique<Level>(&_pool);
   level->owner = node->object;
   level->ownerNode = node;
   level->links = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
@@ -416,7 +418,7 @@ void QELPertController::RemoveNode(Node* node, bool announce) {
     other->links.Remove(link);
     ForgetDueLink(link);
     level->links->RemoveChild(link->rep);
-    std::erase_if(level->linkList, [link](const auto& l) { return l.get() == link; });
+    level->linkList.remove_if([link](const Link& l) { return &l == link; });
   }
   node->links.clear();
   std::erase(level->members, node);

@@ -34,14 +34,12 @@ void QELPertController::AddLinksOf(Node* node) {
       if (existing->from == from && existing->to == to)
         return;
     }
-    auto owned = std::make_unique<Link>();
-    Link* l = owned.get();
+    Link* l = &from->level->linkList.emplace_back();
     l->from = from;
     l->to = to;
     l->rep = VOR2DCustomRep_var::Adopt(new VOR2DCustomRep());
     l->rep->SetTag("PertLink");
     from->level->links->AddChild(l->rep);
-    from->level->linkList.push_back(std::move(owned));
     from->links.push_back(l);
     to->links.push_back(l);
     // Within a batch (a chart being filled) the link is drawn once, when its ends are placed.
