@@ -233,6 +233,69 @@ TEST_F(ControllerTest, BatchedMovesRebuildEachLinkOnceWhereUnbatchedMovesPutIt) 
   EXPECT_EQ(controller->MoveNodeTo(d, 1.0, 1.0, false, reference), E_FAIL) << "not in the chart";
 }
 
+TEST_F(ControllerTest, AChartFilledInOneBatchDrawsEachLinkOnceAsAChartFilledNodeByNode) {
+  // E feeds every other node: E and A hold more links than a node keeps inline.
+  for (VORBaseUnknown_var* n : {&a, &b, &c, &d})
+    ASSERT_EQ(doc->GetDoor().AddFlow(e, *n), S_OK);
+  Build(false);
+  const auto nodeByNode = LinkPoints(*controller);
+  ASSERT_EQ(controller->GetLinkCount(), 8);
+  controller->RemoveNodeManipCmdCB();
+  controller = NULL_var;
+
+  controller = VORHandle<QELPertController>::Adopt(new QELPertController(
+      nullptr, root, viewer, PertViewerProductFlow, PertModeEditable, false, NULL_var));
+  controller->BeginMoves();
+  for (VORBaseUnknown_var* n : {&a, &b, &c, &d, &e}) {
+    ASSERT_EQ(controller->AddChildNode(*n), S_OK);
+    controller->RefreshNodePositionInPert(*n, false);
+  }
+  EXPECT_EQ(controller->GetLinkRebuildCount(), 0u) << "nothing drawn before the batch ends";
+  controller->EndMoves();
+  EXPECT_EQ(controller->GetLinkRebuildCount(), 8u);
+  EXPECT_EQ(LinkPoints(*controller), nodeByNode);
+
+  // Taking the hubs out drops exactly their links, from both ends.
+  ASSERT_EQ(controller->RemoveChildNode(a), S_OK);
+  EXPECT_EQ(controller->GetLinkCount(), 5);
+  ASSERT_EQ(controller->RemoveChildNode(e), S_OK);
+  EXPECT_EQ(controller->GetLinkCount(), 2);
+  ASSERT_EQ(controller->AddChildNode(e), S_OK);
+  EXPECT_EQ(controller->GetLinkCount(), 5) << "E links again to B, C and D";
+}
+
+TEST(NotifySlotTest, OneNotificationServesARunOfDispatchesUnlessAListenerKeepsIt) {
+  struct Events {
+    bool keep = false;
+    std::vector<VORNotification*> seen;
+    std::vector<VORHandle<VORNotification>> kept;
+    int Dispatch(VORNotification* n) {
+      seen.push_back(n);
+      if (keep)
+        kept.emplace_back(n);
+      return 0;
+    }
+  } events;
+  const auto node = VORHandle<VORNotification>::Adopt(new VORNotification());  // any object
+  const unsigned long references = node->RefCount();
+  QELPertNotifySlot<QELPertPositionNotify> slot;
+  slot.Dispatch(events, VORBaseUnknown_var(node.get()), 1.0, 2.0);
+  slot.Dispatch(events, VORBaseUnknown_var(node.get()), 3.0, 4.0);
+  EXPECT_EQ(events.seen[0], events.seen[1]);
+  EXPECT_EQ(node->RefCount(), references) << "the node is not held between dispatches";
+
+  events.keep = true;
+  slot.Dispatch(events, VORBaseUnknown_var(node.get()), 5.0, 6.0);
+  slot.Dispatch(events, VORBaseUnknown_var(node.get()), 7.0, 8.0);
+  ASSERT_EQ(events.kept.size(), 2u);
+  EXPECT_NE(events.kept[0].get(), events.kept[1].get());
+  double x = 0.0, y = 0.0;
+  static_cast<QELPertPositionNotify*>(events.kept[0].get())->GetPosition(x, y);
+  EXPECT_EQ(x, 5.0) << "a kept notification still tells what it was sent for";
+  EXPECT_EQ(static_cast<QELPertPositionNotify*>(events.kept[0].get())->GetNode().Identity(),
+            node->GetIdentity());
+}
+
 TEST_F(ControllerTest, DraggingABoxMovesTheNodeSnapsItAndNotifiesTheRoot) {
   Build(true);
   notes.Listen(root);
