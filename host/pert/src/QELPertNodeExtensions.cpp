@@ -151,14 +151,17 @@ class QELEPertPosition : public VORExtension, public QELIPertPosition {
 
 }  // namespace
 
+// QELIPertNode and QELIPertPosition hold no state of their own, yet charts, layouts and ZitBlts
+// ask for them on every move: made once per node and kept with it, rather than made and freed
+// on each query.
 void QELPertRegisterNodeExtensions() {
   VORExtensionRegistry::Register(
       VORModelLateTypes::GraphNode, QELIPertNodeExt::IID(),
       []() -> VORExtension* { return new QELEPertNodeExt(); }, VORExtensionKind::Data);
   VORExtensionRegistry::Register(
       VORModelLateTypes::GraphNode, QELIPertNode::IID(),
-      []() -> VORExtension* { return new QELEPertNode(); }, VORExtensionKind::Code);
+      []() -> VORExtension* { return new QELEPertNode(); }, VORExtensionKind::Data);
   VORExtensionRegistry::Register(
       VORModelLateTypes::GraphNode, QELIPertPosition::IID(),
-      []() -> VORExtension* { return new QELEPertPosition(); }, VORExtensionKind::Code);
+      []() -> VORExtension* { return new QELEPertPosition(); }, VORExtensionKind::Data);
 }
