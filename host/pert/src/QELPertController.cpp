@@ -155,6 +155,7 @@ QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Leve
   node->bag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
   node->bag->SetTag("PertNode");
   node->bag->SetObject(node->object);
+  node->bag->ReserveChildren(2);  // the box and the label
   // No points yet: BuildShape gives the box its size.
   auto box = VORHandle<VOR2DPolygonRep>::Adopt(new VOR2DPolygonRep(nullptr, 0, 1));
   // Filled by the kind of activity, so that a station is told from a loading at a glance.

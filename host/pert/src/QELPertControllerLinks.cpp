@@ -89,6 +89,7 @@ void QELPertController::UpdateLink(Link* link) {
   const std::uint32_t word =
       VOR2DGraphicAttribute::Pack(QELPertParameters::LinkColor, 4, 1, 4, false, true);
   link->rep->RemoveAllPrimitives();
+  link->rep->ReservePrimitives(2);
   link->rep->AddPrimitive(new VOR2DPolylineGP(route, 4, 1), word, 255);
   link->rep->AddPrimitive(new VOR2DPolylineGP(head, 3, 1), word, 255);
 }

@@ -24,6 +24,8 @@ class VOR2DBagRep : public VOR2DRep {
   void EmptyBag();
 
   int GetSize() const { return static_cast<int>(_children.size()); }
+  // Room for count children at once, for a bag built with a known number of them.
+  void ReserveChildren(int count) { _children.reserve(static_cast<size_t>(count)); }
   // Child at position 1..GetSize(), null out of range.
   VOR2DRep* GetChild(int position) const;
   const std::vector<VOR2DRep_var>& GetChildren() const { return _children; }

@@ -25,6 +25,8 @@ class VOR2DCustomRep : public VOR2DRep {
   // False, and nothing changes, when there is no polyline at position.
   bool ModifyPolyline(int position, const VORMathPoint2Df* points, int count);
   int GetPrimitiveCount() const { return static_cast<int>(_primitives.size()); }
+  // Room for count primitives at once, for a rep built with a known number of them.
+  void ReservePrimitives(int count) { _primitives.reserve(static_cast<size_t>(count)); }
   const VOR2DGP* GetPrimitive(int position) const;  // 1-based, null out of range
   VOR2DGraphicAttribute GetAttribute(int position) const;
 
