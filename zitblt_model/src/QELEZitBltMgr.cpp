@@ -159,9 +159,7 @@ void QELEZitBltMgr::AnchorFor(const VORUnicodeString& location, double x, double
 }
 
 void QELEZitBltMgr::Place(QELZitBltRep* rep, double x, double y, double w, double h) {
-  VOR2DBagRep* button = rep->GetZitBltBtn();
-  VOR2DBagRep* expanded = rep->GetZitBltExpanded();
-  if (button == nullptr || expanded == nullptr)
+  if (rep->GetZitBltBtn() == nullptr)
     return;
   rep->SetPositioningLimits(x - w / 2, y - h / 2, x + w / 2, y + h / 2);
   double ax = 0.0;
@@ -169,8 +167,7 @@ void QELEZitBltMgr::Place(QELZitBltRep* rep, double x, double y, double w, doubl
   AnchorFor(rep->GetLocation(), x, y, w, h, ax, ay);
   VOR3x3Matrix matrix;
   matrix.SetTranslation(ax, ay);
-  button->SetMatrix(matrix);
-  expanded->SetMatrix(matrix);
+  rep->SetBagsMatrix(matrix);
 }
 
 HRESULT QELEZitBltMgr::GetZitBltNames(VORListValVORUnicodeString*& names) {

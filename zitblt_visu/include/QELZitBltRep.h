@@ -21,6 +21,12 @@ class QELBaseScrollListZitBltRep;
 // True when text is the ASCII keyword (a location or a ZitBlt name), without building a string.
 bool QELIsKeyword(const VORUnicodeString& text, std::string_view keyword);
 
+// The one kept copy of text. The strings of a ZitBlt (name, location, priority, state, icon)
+// come from the configuration and repeat on every node of a level: each rep points at a shared
+// copy instead of owning four strings of its own. Kept for the life of the process; the set of
+// texts is as small as the configuration.
+const VORUnicodeString& QELSharedText(const VORUnicodeString& text);
+
 class QELZitBltRep : public VORCommand {
   VOR_DECLARE_CLASS(QELZitBltRep, VORCommand)
  public:
@@ -41,24 +47,30 @@ class QELZitBltRep : public VORCommand {
   // The scroll-list form of this rep, for the list update commands; null for a plain ZitBlt.
   virtual QELBaseScrollListZitBltRep* GetScrollListRep() { return nullptr; }
 
-  void SetName(const VORUnicodeString& name) { _name = name; }
-  const VORUnicodeString& GetName() const { return _name; }
-  void SetLocation(const VORUnicodeString& location) { _location = location; }
-  const VORUnicodeString& GetLocation() const { return _location; }
-  void SetPriority(const VORUnicodeString& priority) { _priority = priority; }
-  VORUnicodeString GetPriority() const { return _priority; }
-  void SetInitialState(const VORUnicodeString& state) { _initialState = state; }
-  VORUnicodeString GetInitialState() const { return _initialState; }
+  void SetName(const VORUnicodeString& name) { _name = &QELSharedText(name); }
+  const VORUnicodeString& GetName() const { return *_name; }
+  void SetLocation(const VORUnicodeString& location) { _location = &QELSharedText(location); }
+  const VORUnicodeString& GetLocation() const { return *_location; }
+  void SetPriority(const VORUnicodeString& priority) { _priority = &QELSharedText(priority); }
+  VORUnicodeString GetPriority() const { return *_priority; }
+  void SetInitialState(const VORUnicodeString& state) { _initialState = &QELSharedText(state); }
+  VORUnicodeString GetInitialState() const { return *_initialState; }
   // The icon's base name (".bmp" is added); only read by BuildRep and SetZitbltButtonGrey.
-  void SetIcon(const VORUnicodeString& icon) { _icon = icon; }
-  VORUnicodeString GetIcon() const { return _icon; }
+  void SetIcon(const VORUnicodeString& icon) { _icon = &QELSharedText(icon); }
+  VORUnicodeString GetIcon() const { return *_icon; }
 
   // 1 shows both bags, 0 hides both; other values are only stored.
   void SetStatus(unsigned char status);
   unsigned char GetStatus() const { return _status; }
 
   VOR2DBagRep* GetZitBltBtn() const { return _btnBag.get(); }
-  VOR2DBagRep* GetZitBltExpanded() const { return _expandedBag.get(); }
+  // The expanded bag, made on first need (null before BuildRep): a closed ZitBlt that is never
+  // opened or looked into carries none. It always has the button's translation.
+  VOR2DBagRep* GetZitBltExpanded();
+  // Whether the expanded bag is shown (there is none while it is hidden and never looked into).
+  bool IsExpandedShown() const { return _expandedBag && _expandedBag->IsShown(); }
+  // Sets both bags' matrix (the placement on the node).
+  void SetBagsMatrix(const VOR3x3Matrix& matrix);
   VOR2DManipulator* GetManipulator() const { return _manipulator; }
   bool IsButtonCollapse() const { return _collapsed != 0; }
   // True while the button shows its icon in grey.
@@ -97,6 +109,8 @@ class QELZitBltRep : public VORCommand {
  protected:
   ~QELZitBltRep() override;
   void SetTranslation(double x, double y);
+  // The expanded bag's show mode: a hidden bag that does not exist yet stays so.
+  void SetExpandedShowMode(int mode);
   // Called just before the expanded bag is shown (opened, or shown by its status).
   virtual void BeforeExpandedShown() {}
   // Whether BuildRep draws the button in grey from the start (an empty list) rather than in
@@ -105,15 +119,16 @@ class QELZitBltRep : public VORCommand {
 
   int _btnState = 0;
   VOR2DBagRep_var _btnBag;
-  VOR2DBagRep_var _expandedBag;
+  VOR2DBagRep_var _expandedBag;              // see GetZitBltExpanded
+  int _expandedShowMode = 0;                 // while there is no expanded bag
   VOR2DManipulator* _manipulator = nullptr;  // the creator's reference
   unsigned char _collapsed = 1;
-  VORUnicodeString _icon;
+  const VORUnicodeString* _icon = &QELSharedText(VORUnicodeString());
   VORViewer_var _viewer;
-  VORUnicodeString _name;
-  VORUnicodeString _location;
-  VORUnicodeString _priority;
-  VORUnicodeString _initialState;
+  const VORUnicodeString* _name = _icon;
+  const VORUnicodeString* _location = _icon;
+  const VORUnicodeString* _priority = _icon;
+  const VORUnicodeString* _initialState = _icon;
   unsigned char _status = 1;
   float _lastDragX = 0.0f;
   float _lastDragY = 0.0f;

@@ -146,7 +146,7 @@ void QELBaseScrollListZitBltRep::BuildRep(VORViewer* viewer) {
     _viewer = viewer;
     QELZitBltRep::BuildRep(viewer);
   }
-  if (!_expandedBag)
+  if (!GetZitBltBtn())
     return;
   // The selection set of the viewer's editor: the list starts watching it with its first item
   // rep, before which nothing of the list can be picked.
@@ -220,12 +220,12 @@ void QELBaseScrollListZitBltRep::AppendScrollList(VORBaseUnknown* item, bool noG
     return;
   _appended.Append(VORBaseUnknown_var(item));
   _appended.RemoveDuplicates();
-  if (!_expandedBag)
+  if (!GetZitBltBtn())
     return;
   if (_appended.Size() == 1 && !noGreyChange)
     RestoreButtonColour();
   const int last = _appended.Size();
-  AddListItemRep(_expandedBag, _appended[last], last, typeCode);
+  AddListItemRep(GetZitBltExpanded(), _appended[last], last, typeCode);
   ReDraw();
 }
 
@@ -289,7 +289,7 @@ void QELBaseScrollListZitBltRep::RemoveAllItems(unsigned char greyButton) {
   _itemsAdded = 0;
   ClearLists();
   EmptyExpandedBagRep();
-  if (!_expandedBag)
+  if (!GetZitBltBtn())
     return;
   if (greyButton == 1 && !IsButtonGrey())
     SetZitbltButtonGrey(1);
@@ -298,7 +298,8 @@ void QELBaseScrollListZitBltRep::RemoveAllItems(unsigned char greyButton) {
     _scrollManipulator->RemoveElement(_scroller);
   _scroller = NULL_var;
   _track = NULL_var;
-  _expandedBag->EmptyBag();
+  if (_expandedBag)
+    _expandedBag->EmptyBag();
   ReDraw();
 }
 
@@ -340,7 +341,7 @@ bool QELBaseScrollListZitBltRep::DeferDrawing() {
   // besides its reps (the first item, the button's colour) is done here, and its reps follow
   // the same drawing later, as nothing the drawing reads changes meanwhile.
   const int n = _items.Size();
-  if (n == 0 || !_expandedBag || _expandedBag->IsShown() || !_appended.IsEmpty() ||
+  if (n == 0 || !GetZitBltBtn() || IsExpandedShown() || !_appended.IsEmpty() ||
       !_itemVisuals.empty() || (n > _range && !_scrollBarHidden))
     return false;
   _first = 1;
@@ -437,11 +438,11 @@ void QELBaseScrollListZitBltRep::UpdateShowModes() {
 void QELBaseScrollListZitBltRep::AddScroller() {
   const int n = _items.Size();
   const int r = _range;
-  if (n <= r || _scrollBarHidden || !_expandedBag)
+  if (n <= r || _scrollBarHidden || !GetZitBltBtn())
     return;
   const double t = (_first - 1) * static_cast<double>(r) * kTrackPerItem / (n - r);
   const double length = kTrackPerItem * r;
-  const VORUnicodeString& l = _location;
+  const VORUnicodeString& l = GetLocation();
   double x0 = 0.0, x1 = 0.0, y0 = 0.0, y1 = 0.0;  // outer and inner edge, start and end
   double sx0 = 0.0, sx1 = 0.0, sy = 0.0;          // the scroller
   if (IsOneOf(l, {"bottommiddle", "bottomright", "bottomleft"})) {
@@ -481,8 +482,8 @@ void QELBaseScrollListZitBltRep::AddScroller() {
                                                static_cast<float>(sx1), static_cast<float>(sy)));
   _scroller->SetColorIndex(kScrollerColour);
   _scroller->SetLineThickness(kScrollerThickness);
-  _expandedBag->AddChild(_track);
-  _expandedBag->AddChild(_scroller);
+  GetZitBltExpanded()->AddChild(_track);
+  GetZitBltExpanded()->AddChild(_scroller);
   GetScrollManipulator()->AddElement(_scroller);
 }
 
@@ -846,7 +847,7 @@ VORNotifPropagation QELBaseScrollListZitBltRep::AnalyseNotification(VORCommand* 
   // button's manipulator hands the menu on to this rep, its father).
   if (notif != nullptr && _manipulator != nullptr && from == _manipulator &&
       dynamic_cast<VORContext*>(notif) != nullptr) {
-    if (_expandedBag)
+    if (GetZitBltBtn())
       OnZitBtnContextMenu(notif);
     return VORNotifDontPropagate;
   }

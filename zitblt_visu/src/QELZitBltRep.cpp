@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <map>
+#include <set>
 
 #include "VOR2DImagePixelRep.h"
 #include "VOR2DManipulator.h"
@@ -59,6 +60,11 @@ bool QELIsKeyword(const VORUnicodeString& text, std::string_view keyword) {
   return points.size() == keyword.size() &&
          std::equal(points.begin(), points.end(), keyword.begin(),
                     [](char32_t a, char b) { return a == static_cast<unsigned char>(b); });
+}
+
+const VORUnicodeString& QELSharedText(const VORUnicodeString& text) {
+  static std::set<VORUnicodeString> texts;
+  return *texts.insert(text).first;
 }
 
 VORPixelImage* QELZitBltRep::LoadIconImage(const VORUnicodeString& fileName) {
@@ -157,26 +163,27 @@ void QELZitBltRep::BuildRep(VORViewer* viewer) {
   // A second build replaces the first: its models leave the interactive set.
   RemoveModels();
   _btnBag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
-  _expandedBag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  _expandedBag = NULL_var;
+  _expandedShowMode = 0;
   _viewer = viewer;
 
   if (VORISO* iso = CurrentISO()) {
     _iso = iso;
     _btnModel = VORModelForRep2D_var::Adopt(new VORModelForRep2D());
     _btnModel->SetRep(_btnBag);
+    // In the set at once, after the button, so that the bag made later is drawn where it would
+    // have been; a model without a rep draws and picks nothing.
     _expandedModel = VORModelForRep2D_var::Adopt(new VORModelForRep2D());
-    _expandedModel->SetRep(_expandedBag);
     iso->AddElement(_btnModel);
     iso->AddElement(_expandedModel);
   }
 
   SetZitbltButtonGrey(ButtonStartsGrey() ? 1 : 0);
-  if (_collapsed)
-    _expandedBag->SetShowMode(1);
+  SetExpandedShowMode(_collapsed ? 1 : 0);
 
   DeleteManipulator();
   _manipulator = new VOR2DManipulator(this, "ActivManip", _btnBag, 1, 0);
-  if (IsHorizontalEdge(_location)) {
+  if (IsHorizontalEdge(GetLocation())) {
     _manipulator->SetDirection(VORMathVector2Df(1.0f, 0.0f));
     _horizontalLimit = 1;
     _verticalLimit = 0;
@@ -187,10 +194,37 @@ void QELZitBltRep::BuildRep(VORViewer* viewer) {
   }
 }
 
+VOR2DBagRep* QELZitBltRep::GetZitBltExpanded() {
+  if (_expandedBag || !_btnBag)
+    return _expandedBag.get();
+  _expandedBag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  _expandedBag->SetShowMode(_expandedShowMode);
+  if (const VOR3x3Matrix* matrix = _btnBag->GetMatrix())
+    _expandedBag->SetMatrix(*matrix);
+  if (_expandedModel)
+    _expandedModel->SetRep(_expandedBag);
+  return _expandedBag.get();
+}
+
+void QELZitBltRep::SetExpandedShowMode(int mode) {
+  if (_expandedBag || mode == 0) {
+    if (VOR2DBagRep* expanded = GetZitBltExpanded())
+      expanded->SetShowMode(mode);
+  }
+  _expandedShowMode = mode;
+}
+
+void QELZitBltRep::SetBagsMatrix(const VOR3x3Matrix& matrix) {
+  if (_btnBag)
+    _btnBag->SetMatrix(matrix);
+  if (_expandedBag)
+    _expandedBag->SetMatrix(matrix);
+}
+
 void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
   if (!_btnBag)
     return;
-  VORPixelImage_var image(ButtonImage(_icon, grey == 1));
+  VORPixelImage_var image(ButtonImage(*_icon, grey == 1));
   if (!image)
     return;
   for (int i = _btnBag->GetSize(); i >= 1; --i)
@@ -202,7 +236,7 @@ void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
   imageRep->GetBoundingBox(xmin, ymin, xmax, ymax);
   float ox = 0.0f;
   float oy = 0.0f;
-  QELZitBltIconOffset(_location, xmax - xmin, ymax - ymin, ox, oy);
+  QELZitBltIconOffset(GetLocation(), xmax - xmin, ymax - ymin, ox, oy);
   imageRep->Modify(VORMathPoint2Df(static_cast<float>(ox - 2.0), static_cast<float>(oy - 2.0)));
   imageRep->SetAlphaMode(1);
 
@@ -211,18 +245,18 @@ void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
 }
 
 void QELZitBltRep::SetShowMode(int mode) {
-  if (_expandedBag && mode == 0)
+  if (_btnBag && mode == 0)
     BeforeExpandedShown();
-  if (_expandedBag)
-    _expandedBag->SetShowMode(mode);
+  if (_btnBag)
+    SetExpandedShowMode(mode);
   ReDraw();
 }
 
 void QELZitBltRep::ExpandZitBlt() {
   _collapsed = 0;
-  if (_expandedBag) {
+  if (_btnBag) {
     BeforeExpandedShown();
-    _expandedBag->SetShowMode(0);
+    SetExpandedShowMode(0);
     if (_viewer)
       _viewer->Draw();
   }
@@ -230,8 +264,8 @@ void QELZitBltRep::ExpandZitBlt() {
 
 void QELZitBltRep::CollapseZitBlt() {
   _collapsed = 1;
-  if (_expandedBag) {
-    _expandedBag->SetShowMode(1);
+  if (_btnBag) {
+    SetExpandedShowMode(1);
     if (_viewer)
       _viewer->Draw();
   }
@@ -262,18 +296,14 @@ void QELZitBltRep::SetStatus(unsigned char status) {
   const int mode = status == 1 ? 0 : 1;
   if (_btnBag)
     _btnBag->SetShowMode(mode);
-  if (_expandedBag && mode == 0)
+  if (_btnBag && mode == 0)
     BeforeExpandedShown();
-  if (_expandedBag)
-    _expandedBag->SetShowMode(mode);
+  if (_btnBag)
+    SetExpandedShowMode(mode);
 }
 
 void QELZitBltRep::SetTranslation(double x, double y) {
-  const VOR3x3Matrix matrix = VOR3x3Matrix::Translation(x, y);
-  if (_btnBag)
-    _btnBag->SetMatrix(matrix);
-  if (_expandedBag)
-    _expandedBag->SetMatrix(matrix);
+  SetBagsMatrix(VOR3x3Matrix::Translation(x, y));
 }
 
 void QELZitBltRep::SetPoDPosition(double x, double y) {

@@ -6,6 +6,8 @@
 
 #include <vector>
 
+#include <absl/container/inlined_vector.h>
+
 #include "VOREventSubscriber.h"
 #include "VORString.h"
 
@@ -15,6 +17,10 @@ inline constexpr VORStatusChangeRC VORStatusChangeRCAborted = 1;
 
 // What AnalyseNotification asks SendNotification to do next.
 enum VORNotifPropagation { VORNotifDontPropagate = 0, VORNotifPropagate = 1 };
+
+class VORCommand;
+// Most commands have no child or one (a rep and its manipulator): no storage of their own.
+using VORCommandChildren = absl::InlinedVector<VORCommand*, 2>;
 
 class VORCommand : public VOREventSubscriber {
   VOR_DECLARE_CLASS(VORCommand, VOREventSubscriber)
@@ -27,7 +33,7 @@ class VORCommand : public VOREventSubscriber {
   VORCommand* GetFather() const { return _father; }
   void SetFather(VORCommand* father);
   // The commands whose father this is, in order of attachment (not held).
-  const std::vector<VORCommand*>& GetChildren() const { return _children; }
+  const VORCommandChildren& GetChildren() const { return _children; }
 
   // Delivers notification to `to`, then to its fathers while each answers VORNotifPropagate.
   // The sender seen by every receiver is this command.
@@ -53,7 +59,7 @@ class VORCommand : public VOREventSubscriber {
  private:
   VORString _name;
   VORCommand* _father = nullptr;
-  std::vector<VORCommand*> _children;
+  VORCommandChildren _children;
   VORHandle<VOREventPublisher> _publisher;
 };
 

@@ -4,8 +4,9 @@
 #pragma once
 
 #include <cstddef>
-#include <unordered_map>
 #include <vector>
+
+#include <absl/container/flat_hash_map.h>
 
 #include "VOREventPublisher.h"
 #include "VORLists.h"
@@ -41,8 +42,9 @@ class VORISO : public VORBaseUnknown {
   void Invalidate();
 
   std::vector<VORBaseUnknown_var> _slots;
-  std::unordered_map<VORBaseUnknown*, std::size_t> _slotOf;  // identity -> index in _slots
-  mutable VORListValVORBaseUnknown_var _models;              // _slots without the holes
+  // identity -> index in _slots; flat, so that adding a model allocates nothing of its own.
+  absl::flat_hash_map<VORBaseUnknown*, std::size_t> _slotOf;
+  mutable VORListValVORBaseUnknown_var _models;  // _slots without the holes
   mutable bool _modelsValid = true;
   std::vector<VORBaseUnknown*> _viewers;
   VORHandle<VOREventPublisher> _publisher;

@@ -18,8 +18,10 @@ VORCommand::~VORCommand() {
 void VORCommand::SetFather(VORCommand* father) {
   if (father == _father || father == this)
     return;
-  if (_father != nullptr)
-    std::erase(_father->_children, this);
+  if (_father != nullptr) {
+    VORCommandChildren& siblings = _father->_children;
+    siblings.erase(std::remove(siblings.begin(), siblings.end(), this), siblings.end());
+  }
   _father = father;
   if (_father != nullptr)
     _father->_children.push_back(this);

@@ -4,7 +4,13 @@
 #include <memory>
 #include <vector>
 
+#include <absl/container/inlined_vector.h>
+
 #include "VOR2DRep.h"
+
+// Most bags of a chart hold one or two reps (a button, a label and its box): those need no
+// storage of their own.
+using VOR2DBagChildren = absl::InlinedVector<VOR2DRep_var, 2>;
 
 class VOR2DBagRep : public VOR2DRep {
   VOR_DECLARE_CLASS(VOR2DBagRep, VOR2DRep)
@@ -28,7 +34,7 @@ class VOR2DBagRep : public VOR2DRep {
   void ReserveChildren(int count) { _children.reserve(static_cast<size_t>(count)); }
   // Child at position 1..GetSize(), null out of range.
   VOR2DRep* GetChild(int position) const;
-  const std::vector<VOR2DRep_var>& GetChildren() const { return _children; }
+  const VOR2DBagChildren& GetChildren() const { return _children; }
 
   void SetMatrix(const VOR3x3Matrix& matrix);
   // Null when no matrix was set (the bag draws its children as they are).
@@ -61,7 +67,7 @@ class VOR2DBagRep : public VOR2DRep {
   // Positions (0-based) of the children whose box may hold p within tolerance, last first.
   void Candidates(const VORMathPoint2D& p, double tolerance, std::vector<int>& out) const;
 
-  std::vector<VOR2DRep_var> _children;
+  VOR2DBagChildren _children;
   mutable VORBox2D _localBox;             // shown children, in the children's frame
   mutable unsigned long _boxVersion = 0;  // bumped by each box computation
   mutable unsigned long _indexVersion = 0;

@@ -18,6 +18,8 @@
 
 #include <vector>
 
+#include <absl/container/inlined_vector.h>
+
 #include "VORCommand.h"
 #include "VORContext.h"
 #include "VORMath2D.h"
@@ -45,6 +47,9 @@ class VORManipulatorNotification : public VORNotification {
   VORMathPoint2D _delta;
   int _modifiers = 0;
 };
+
+// A manipulator usually handles one rep (a button, a scroller): no storage of its own.
+using VORManipulatedReps = absl::InlinedVector<VORHandle<VOR2DRep>, 1>;
 
 class VORManipulator : public VORCommand {
   VOR_DECLARE_CLASS(VORManipulator, VORCommand)
@@ -75,7 +80,7 @@ class VORManipulator : public VORCommand {
   bool RemoveElement(VOR2DRep* rep);
   void RemoveAllElements();
   int GetElementCount() const { return static_cast<int>(_reps.size()); }
-  const std::vector<VORHandle<VOR2DRep>>& GetElements() const { return _reps; }
+  const VORManipulatedReps& GetElements() const { return _reps; }
 
   VORNotification* GetVORPreactivate() const { return Notification(kPreactivateSlot); }
   VORNotification* GetVOREndPreactivate() const { return Notification(kEndPreactivateSlot); }
@@ -117,7 +122,7 @@ class VORManipulator : public VORCommand {
   bool _hasDirection = false;
   VORMathVector2Df _direction;
   VORMathAxis2D _position;
-  std::vector<VORHandle<VOR2DRep>> _reps;
+  VORManipulatedReps _reps;
   enum Slot {
     kPreactivateSlot,
     kEndPreactivateSlot,

@@ -58,7 +58,7 @@ bool VOR2DBagRep::DestroyChild(VOR2DRep* child) {
 }
 
 void VOR2DBagRep::EmptyBag() {
-  std::vector<VOR2DRep_var> children;
+  VOR2DBagChildren children;
   children.swap(_children);
   for (VOR2DRep_var& child : children) {
     child->_father = nullptr;

@@ -58,7 +58,7 @@ bool VORManipulator::RemoveElement(VOR2DRep* rep) {
 }
 
 void VORManipulator::RemoveAllElements() {
-  std::vector<VORHandle<VOR2DRep>> reps;
+  VORManipulatedReps reps;
   reps.swap(_reps);
   for (auto& rep : reps) {
     if (rep->_manipulator == this)
