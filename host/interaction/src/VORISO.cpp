@@ -1,6 +1,13 @@
 #include "VORISO.h"
 
 #include <algorithm>
+#include <string>
+
+namespace {
+// Event names made once: a chart adds several models per node.
+const std::string kAdded = "VORISOAdd";
+const std::string kRemoved = "VORISORemove";
+}  // namespace
 
 VORISO::VORISO() : _publisher(VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher(this))) {}
 
@@ -49,7 +56,7 @@ bool VORISO::AddElement(VORBaseUnknown* model) {
     return false;
   _slots.emplace_back(model);
   Invalidate();
-  _publisher->Dispatch("VORISOAdd");
+  _publisher->Dispatch(kAdded);
   return true;
 }
 
@@ -63,7 +70,7 @@ bool VORISO::RemoveElement(VORBaseUnknown* model) {
   if (_slots.size() > 2 * _slotOf.size() + 16)
     Compact();
   Invalidate();
-  _publisher->Dispatch("VORISORemove");
+  _publisher->Dispatch(kRemoved);
   return true;
 }
 
@@ -74,7 +81,7 @@ void VORISO::Empty() {
   removed.swap(_slots);
   _slotOf.clear();
   Invalidate();
-  _publisher->Dispatch("VORISORemove");
+  _publisher->Dispatch(kRemoved);
 }
 
 void VORISO::AddViewer(VORBaseUnknown* viewer) {

@@ -67,15 +67,19 @@ class VOR2DBagRep : public VOR2DRep {
   // Positions (0-based) of the children whose box may hold p within tolerance, last first.
   void Candidates(const VORMathPoint2D& p, double tolerance, std::vector<int>& out) const;
 
+  // The grid of children's boxes of a large bag; the many small bags of a chart have none.
+  struct PickIndex {
+    unsigned long version = 0;  // the _boxVersion it was built for
+    int cells = 0;              // grid of cells x cells over _localBox
+    std::vector<std::vector<int>> buckets;
+  };
+
   VOR2DBagChildren _children;
   mutable VORBox2D _localBox;             // shown children, in the children's frame
   mutable unsigned long _boxVersion = 0;  // bumped by each box computation
-  mutable unsigned long _indexVersion = 0;
-  mutable int _cells = 0;  // grid of _cells x _cells over _localBox
-  mutable std::vector<std::vector<int>> _index;
+  mutable std::unique_ptr<PickIndex> _index;
+  // The inverse is computed when a pick needs it: matrices change far more often than picks.
   VOR3x3Matrix _matrix;
-  VOR3x3Matrix _inverse;
   bool _hasMatrix = false;
-  bool _invertible = true;
 };
 VOR_DECLARE_HANDLE(VOR2DBagRep);

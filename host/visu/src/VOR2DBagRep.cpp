@@ -76,15 +76,12 @@ VOR2DRep* VOR2DBagRep::GetChild(int position) const {
 void VOR2DBagRep::SetMatrix(const VOR3x3Matrix& matrix) {
   _matrix = matrix;
   _hasMatrix = true;
-  _invertible = matrix.Invert(_inverse);
   InvalidateFrame();
 }
 
 void VOR2DBagRep::ResetMatrix() {
   _matrix = VOR3x3Matrix();
-  _inverse = VOR3x3Matrix();
   _hasMatrix = false;
-  _invertible = true;
   InvalidateFrame();
 }
 
@@ -124,21 +121,25 @@ void VOR2DBagRep::SetIndexThreshold(int children) {
 }
 
 void VOR2DBagRep::BuildIndex() const {
-  _indexVersion = _boxVersion;
-  _index.clear();
-  _cells = 0;
+  if (!_index)
+    _index = std::make_unique<PickIndex>();
+  PickIndex& index = *_index;
+  index.version = _boxVersion;
+  index.buckets.clear();
+  index.cells = 0;
   if (_localBox.IsEmpty())
     return;
   // About four children per cell when they are spread evenly.
   const double n = static_cast<double>(_children.size());
-  _cells = std::clamp(static_cast<int>(std::ceil(std::sqrt(n / 4.0))), 1, 512);
-  _index.assign(static_cast<size_t>(_cells) * static_cast<size_t>(_cells), {});
-  const double cw = _localBox.Width() / _cells;
-  const double ch = _localBox.Height() / _cells;
-  auto cell = [this](double v, double origin, double size) {
+  const int cells = std::clamp(static_cast<int>(std::ceil(std::sqrt(n / 4.0))), 1, 512);
+  index.cells = cells;
+  index.buckets.assign(static_cast<size_t>(cells) * static_cast<size_t>(cells), {});
+  const double cw = _localBox.Width() / cells;
+  const double ch = _localBox.Height() / cells;
+  auto cell = [cells](double v, double origin, double size) {
     if (!(size > 0.0))
       return 0;
-    return std::clamp(static_cast<int>(std::floor((v - origin) / size)), 0, _cells - 1);
+    return std::clamp(static_cast<int>(std::floor((v - origin) / size)), 0, cells - 1);
   };
   for (size_t i = 0; i < _children.size(); ++i) {
     const VOR2DRep* child = _children[i].get();
@@ -153,7 +154,7 @@ void VOR2DBagRep::BuildIndex() const {
     const int y1 = cell(b.ymax, _localBox.ymin, ch);
     for (int y = y0; y <= y1; ++y) {
       for (int x = x0; x <= x1; ++x)
-        _index[static_cast<size_t>(y * _cells + x)].push_back(static_cast<int>(i));
+        index.buckets[static_cast<size_t>(y * cells + x)].push_back(static_cast<int>(i));
     }
   }
 }
@@ -161,14 +162,15 @@ void VOR2DBagRep::BuildIndex() const {
 void VOR2DBagRep::Candidates(const VORMathPoint2D& p, double tolerance,
                              std::vector<int>& out) const {
   out.clear();
-  if (_cells == 0 || !_localBox.Contains(p.x, p.y, tolerance))
+  const int cells = _index ? _index->cells : 0;
+  if (cells == 0 || !_localBox.Contains(p.x, p.y, tolerance))
     return;
-  const double cw = _localBox.Width() / _cells;
-  const double ch = _localBox.Height() / _cells;
-  auto cell = [this](double v, double origin, double size) {
+  const double cw = _localBox.Width() / cells;
+  const double ch = _localBox.Height() / cells;
+  auto cell = [cells](double v, double origin, double size) {
     if (!(size > 0.0))
       return 0;
-    return std::clamp(static_cast<int>(std::floor((v - origin) / size)), 0, _cells - 1);
+    return std::clamp(static_cast<int>(std::floor((v - origin) / size)), 0, cells - 1);
   };
   const int x0 = cell(p.x - tolerance, _localBox.xmin, cw);
   const int x1 = cell(p.x + tolerance, _localBox.xmin, cw);
@@ -176,7 +178,7 @@ void VOR2DBagRep::Candidates(const VORMathPoint2D& p, double tolerance,
   const int y1 = cell(p.y + tolerance, _localBox.ymin, ch);
   for (int y = y0; y <= y1; ++y) {
     for (int x = x0; x <= x1; ++x) {
-      const auto& bucket = _index[static_cast<size_t>(y * _cells + x)];
+      const auto& bucket = _index->buckets[static_cast<size_t>(y * cells + x)];
       out.insert(out.end(), bucket.begin(), bucket.end());
     }
   }
@@ -191,9 +193,10 @@ bool VOR2DBagRep::ToLocal(const VORMathPoint2D& p, VORMathPoint2D& local, double
     scale = 1.0;
     return true;
   }
-  if (!_invertible)
+  VOR3x3Matrix inverse;
+  if (!_matrix.Invert(inverse))
     return false;
-  local = _inverse.Transform(p);
+  local = inverse.Transform(p);
   scale = _matrix.ScaleFactor();
   return true;
 }
@@ -224,7 +227,7 @@ void VOR2DBagRep::CollectPicks(const VORMathPoint2D& p, double tolerance,
   const double localTolerance = scale > 0.0 ? tolerance / scale : tolerance;
   chain.push_back(this);
   if (static_cast<int>(_children.size()) >= IndexThreshold()) {
-    if (_indexVersion != _boxVersion)
+    if (!_index || _index->version != _boxVersion)
       BuildIndex();
     std::vector<int> candidates;
     Candidates(local, localTolerance, candidates);
