@@ -374,6 +374,13 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
   sortedIndex.reserve(static_cast<size_t>(n));
   for (int p = 1; p <= n; ++p)
     sortedIndex.emplace((*_childNodeList)[p].Identity(), p);
+  // The chart area depends on the levels only, which no move changes.
+  float width = 300.0f;
+  float height = 200.0f;
+  GetViewerOrSuperNodeSize(&width, &height);
+  const float side = width;
+  const int highest = (*_levelList)[n];
+  const float xStep = highest > 0 ? side / static_cast<float>(highest) : 0.0f;
   for (VORBaseUnknown_var& newNode : *newNodes) {
     // What moves: the new node and everything downstream of it (the change list, as a set).
     std::unordered_set<VORBaseUnknown*> change;
@@ -383,23 +390,14 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
       while (!pending.empty()) {
         VORBaseUnknown_var current = pending.back();
         pending.pop_back();
-        VORISPPFlowMgt_var flows(current);
-        VORListValVORBaseUnknown_var* next = nullptr;
-        if (flows && SUCCEEDED(flows->GetNextActivities(next, "Activity")) && next != nullptr) {
-          for (const VORBaseUnknown_var& s : *next) {
-            if (change.insert(s.Identity()).second)
-              pending.push_back(s);
-          }
+        if (VORISPPFlowMgt_var flows(current); flows) {
+          flows->ForEachNextActivity([&](VORBaseUnknown* s) {
+            if (change.insert(s->GetIdentity()).second)
+              pending.emplace_back(s);
+          });
         }
-        delete next;
       }
     }
-    float width = 300.0f;
-    float height = 200.0f;
-    GetViewerOrSuperNodeSize(&width, &height);
-    const float side = width;
-    const int highest = (*_levelList)[n];
-    const float xStep = highest > 0 ? side / static_cast<float>(highest) : 0.0f;
     double x = 0.0;
     double y = 0.0;
     auto found = newNode ? sortedIndex.find(newNode.Identity()) : sortedIndex.end();
@@ -427,8 +425,9 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
         });
       }
     }
-    _controller->GetViewer()->Reframe();
   }
+  // Framed once when every new node is placed: each reframe visits the whole scene.
+  _controller->GetViewer()->Reframe();
   return true;
 }
 
