@@ -37,6 +37,43 @@ TEST(UnicodeStringTest, MalformedUtf8BecomesReplacementCharacters) {
   EXPECT_EQ(s[3], U'\uFFFD');
 }
 
+TEST(UnicodeStringTest, CopiesStayIndependentWhenOneGrows) {
+  // Short strings live inline, longer ones share a block between copies: appending to one copy
+  // must leave the others as they were, whatever the storage.
+  for (const char* text : {"", "ab", "abc", "abcd", "Underbody station"}) {
+    VORUnicodeString original(text);
+    VORUnicodeString copy = original;
+    VORUnicodeString assigned;
+    assigned = copy;
+    copy += VORUnicodeString("/1");
+    assigned.Append(assigned);
+    EXPECT_EQ(original.ConvertToUTF8(), text);
+    EXPECT_EQ(copy.ConvertToUTF8(), std::string(text) + "/1");
+    EXPECT_EQ(assigned.ConvertToUTF8(), std::string(text) + text);
+    VORUnicodeString moved = std::move(copy);
+    EXPECT_EQ(moved.ConvertToUTF8(), std::string(text) + "/1");
+    EXPECT_EQ(original + VORUnicodeString("!"), VORUnicodeString(std::string(text) + "!"));
+  }
+}
+
+TEST(UnicodeStringTest, GrowsInPlaceAndOrdersByCodePoint) {
+  VORUnicodeString grown;
+  std::string expected;
+  for (int i = 0; i < 50; ++i) {
+    grown += VORUnicodeString("ä");
+    expected += "ä";
+  }
+  EXPECT_EQ(grown.GetLengthInChar(), 50);
+  EXPECT_EQ(grown.ConvertToUTF8(), expected);
+  // Three multi-byte code points fit where three ASCII ones do.
+  EXPECT_EQ(VORUnicodeString("äöü").GetLengthInChar(), 3);
+  EXPECT_EQ(VORUnicodeString("äöü"), VORUnicodeString::FromUTF16(u"äöü"));
+  EXPECT_LT(VORUnicodeString("Station 1"), VORUnicodeString("Station 2"));
+  EXPECT_LT(VORUnicodeString("abc"), VORUnicodeString("abcd"));
+  EXPECT_EQ(std::hash<VORUnicodeString>()(VORUnicodeString("Station 10")),
+            std::hash<std::u32string>()(U"Station 10"));
+}
+
 TEST(StringTest, NarrowStringsConvertThroughUtf8) {
   VORString name(VORUnicodeString("Zelle Ä1"));
   EXPECT_STREQ(name.CastToCharPtr(), "Zelle Ä1");

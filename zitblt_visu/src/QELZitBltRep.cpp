@@ -56,7 +56,7 @@ VORPixelImage* ButtonImage(const VORUnicodeString& icon, bool grey) {
 }  // namespace
 
 bool QELIsKeyword(const VORUnicodeString& text, std::string_view keyword) {
-  const std::u32string& points = text.CodePoints();
+  const std::u32string_view points = text.CodePoints();
   return points.size() == keyword.size() &&
          std::equal(points.begin(), points.end(), keyword.begin(),
                     [](char32_t a, char b) { return a == static_cast<unsigned char>(b); });

@@ -8,7 +8,7 @@
 #include "VORUnicodeString.h"
 
 inline QString VORQtString(const VORUnicodeString& text) {
-  const std::u32string& s = text.CodePoints();
+  const std::u32string_view s = text.CodePoints();
   return QString::fromUcs4(s.data(), static_cast<qsizetype>(s.size()));
 }
 inline QString VORQtString(const std::string& utf8) {
