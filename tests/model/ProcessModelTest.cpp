@@ -1,5 +1,7 @@
 // The process side of the model, interface by interface: flows and their filters, children,
 // items, resources, product IO and the notifications each change emits.
+#include <functional>
+
 #include "ModelTestSupport.h"
 
 using List = VORListValVORBaseUnknown_var;
@@ -354,4 +356,74 @@ TEST(JoiningCycleTimeTest, PointAndCurveFasteningTimesFollowTheirAttributesThrou
   set(arc, "SeamSpeed", VORAttributeValue::Double(50));
   EXPECT_EQ(curve->UpdateCycleTime(), S_OK);
   EXPECT_EQ(time(arc), 18.0);
+}
+
+TEST(ListIntoCallerTest, AppendVariantsAddWhatTheNewListsHoldAfterTheCallersEntries) {
+  SmallLine l;
+  VORBaseUnknown_var loadOut, sub;
+  VORIProduct_var(l.doc->GetRootProduct())->AddChild("Sub assy", sub);
+  VORISPPFlowMgt_var(l.load)->AddProductOutput(sub, loadOut);
+  VORISPPItemMgt_var(l.weld)->AssignItem(l.bracket);
+  VORISPPResourceManagement_var(l.weld)->AssignResource(l.gun);
+  using Get = std::function<void(List*&)>;
+  using Add = std::function<HRESULT(List&)>;
+  auto compare = [&](VORBaseUnknown* object, const Get& get, const Add& add) {
+    // The caller's list already holds an entry, and a second call appends again.
+    List list;
+    list.Append(VORBaseUnknown_var(l.root));
+    EXPECT_EQ(add(list), S_OK);
+    const int once = list.Size();
+    EXPECT_EQ(add(list), S_OK);
+    List* fresh = nullptr;
+    get(fresh);
+    ASSERT_NE(fresh, nullptr);
+    const std::string expected = Ids(fresh);
+    auto joined = [&](int from, int to) {
+      std::string text;
+      for (int i = from; i <= to; ++i)
+        text += (text.empty() ? "" : " ") + IdOf(list[i].get());
+      return text;
+    };
+    EXPECT_EQ(list[1], l.root) << IdOf(object);
+    EXPECT_EQ(joined(2, once), expected) << IdOf(object);
+    EXPECT_EQ(joined(once + 1, list.Size()), expected) << IdOf(object);
+  };
+  for (VORBaseUnknown* activity : {l.s1.get(), l.s2.get(), l.weld.get()}) {
+    VORISPPFlowMgt_var flow(activity);
+    compare(
+        activity, [&](List*& out) { flow->GetProductInputs(out); },
+        [&](List& out) { return flow->AppendProductInputs(out); });
+    VORISPPItemMgt_var items(activity);
+    compare(
+        activity,
+        [&](List*& out) {
+          items->GetAssignedItems(out, "Item", VORISPPItemMgt::AssignedHereAndBelow);
+        },
+        [&](List& out) {
+          return items->AppendAssignedItems(out, "Item", VORISPPItemMgt::AssignedHereAndBelow);
+        });
+    VORISPPResourceManagement_var resources(activity);
+    compare(
+        activity, [&](List*& out) { resources->GetResources(out, "Resource"); },
+        [&](List& out) { return resources->AppendResources(out, "Resource"); });
+    QELIBIWItemInfo_var info(activity);
+    if (!info)
+      continue;
+    compare(
+        activity, [&](List*& out) { info->GetFirstItemList(out); },
+        [&](List& out) { return info->AppendFirstItemList(out); });
+    compare(
+        activity, [&](List*& out) { info->GetSecondItemList(out); },
+        [&](List& out) { return info->AppendSecondItemList(out); });
+    compare(
+        activity, [&](List*& out) { info->GetActivityList(out); },
+        [&](List& out) { return info->AppendActivityList(out); });
+    compare(
+        activity, [&](List*& out) { info->GetCoveredItems(out); },
+        [&](List& out) { return info->AppendCoveredItems(out); });
+  }
+  // A control node has no product inputs: the caller's list stays as it was.
+  List untouched;
+  EXPECT_EQ(VORISPPFlowMgt_var(l.start)->AppendProductInputs(untouched), E_NOTIMPL);
+  EXPECT_TRUE(untouched.IsEmpty());
 }

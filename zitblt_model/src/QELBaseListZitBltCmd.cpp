@@ -18,8 +18,16 @@
 VORIDOMDocument_var QELBaseListZitBltCmd::_spXmlDocument;
 bool QELBaseListZitBltCmd::_xmlParsed = false;
 
+namespace {
+// Every list command has this name: made once, not once per command.
+const VORString& CommandName() {
+  static const VORString name("QELBaseListZitBltCmd");
+  return name;
+}
+}  // namespace
+
 QELBaseListZitBltCmd::QELBaseListZitBltCmd(VORBaseUnknown* owner)
-    : VORCommand(nullptr, "QELBaseListZitBltCmd"), _owner(owner) {
+    : VORCommand(nullptr, CommandName()), _owner(owner) {
   if (!_xmlParsed)
     InitializeData();
 }
@@ -194,15 +202,17 @@ int QELBaseListZitBltCmd::GetAttributeValue(const VORUnicodeString& name) {
 void QELBaseListZitBltCmd::GetFirstFirstAssignedItems(const VORISPPActivity_var& activity,
                                                       VORListValVORBaseUnknown_var& items) {
   VORISPPItemMgt_var itemMgt(activity);
-  VORListValVORBaseUnknown_var* assigned = nullptr;
-  if (!itemMgt ||
-      FAILED(itemMgt->GetAssignedItems(assigned, "Item", VORISPPItemMgt::FirstAssigned)))
+  if (!itemMgt)
     return;
-  if (assigned == nullptr)
+  // Appended in place (no list of its own per activity), then what is no item is taken out.
+  const int before = items.Size();
+  if (FAILED(itemMgt->AppendAssignedItems(items, "Item", VORISPPItemMgt::FirstAssigned))) {
+    while (items.Size() > before)
+      items.RemovePosition(items.Size());
     return;
-  for (const VORBaseUnknown_var& object : *assigned) {
-    if (VORISPPItem_var(object))
-      items.Append(object);
   }
-  delete assigned;
+  for (int position = items.Size(); position > before; --position) {
+    if (!VORISPPItem_var(items[position]))
+      items.RemovePosition(position);
+  }
 }

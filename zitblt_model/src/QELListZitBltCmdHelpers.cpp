@@ -26,10 +26,10 @@ bool QELIsItemOfType(VORBaseUnknown* object, std::initializer_list<const char*> 
 void QELAppendAssignedInputs(VORISPPFlowMgt* flow, VORListValVORBaseUnknown_var& assigned,
                              QELBaseScrollListZitBltRep* rep,
                              QELIListZitBltItemState::AssignState state) {
-  VORListValVORBaseUnknown_var* inputs = nullptr;
-  if (flow == nullptr || FAILED(flow->GetProductInputs(inputs)) || inputs == nullptr)
+  VORListValVORBaseUnknown_var inputs;
+  if (flow == nullptr || FAILED(flow->AppendProductInputs(inputs)))
     return;
-  for (const VORBaseUnknown_var& input : *inputs) {
+  for (const VORBaseUnknown_var& input : inputs) {
     VORISPPProductIO_var io(input);
     VORBaseUnknown_var item;
     if (io)
@@ -40,5 +40,4 @@ void QELAppendAssignedInputs(VORISPPFlowMgt* flow, VORListValVORBaseUnknown_var&
     rep->AppendItem(input.get(), state);
     assigned.RemovePosition(position);
   }
-  delete inputs;
 }

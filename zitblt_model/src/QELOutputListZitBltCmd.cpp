@@ -18,32 +18,31 @@ void QELOutputListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep) {
   if (rep == nullptr)
     return;
   rep->RemoveAllItems(1);
+  static const VORUnicodeString stationType("BIWActivityStation");
+  static const VORUnicodeString groupingType("BIWActivityGrouping");
   const VORUnicodeString type = QELTypeNameOf(GetOwner().get());
-  const bool station = type == VORUnicodeString("BIWActivityStation");
-  if (!station && type != VORUnicodeString("BIWActivityGrouping")) {
+  const bool station = type == stationType;
+  if (!station && type != groupingType) {
     rep->SetScrollRange(kSpareRange);
     rep->DrawScrollList();
     return;
   }
   int appended = 0;
-  auto append = [&](VORListValVORBaseUnknown_var* objects,
-                    QELIListZitBltItemState::AssignState state) {
-    if (objects == nullptr)
-      return;
-    for (const VORBaseUnknown_var& object : *objects) {
+  // One list for both item lists, emptied in between.
+  VORListValVORBaseUnknown_var objects;
+  auto append = [&](QELIListZitBltItemState::AssignState state) {
+    for (const VORBaseUnknown_var& object : objects) {
       rep->AppendItem(object.get(), state);
       ++appended;
     }
-    delete objects;
+    objects.RemoveAll();
   };
   if (QELIBIWItemInfo_var info(GetOwner()); info) {
-    VORListValVORBaseUnknown_var* first = nullptr;
-    info->GetFirstItemList(first);
-    append(first, QELIListZitBltItemState::Listed);
+    info->AppendFirstItemList(objects);
+    append(QELIListZitBltItemState::Listed);
     // What a grouping hands on from its sub-activities is marked; a station's is not.
-    VORListValVORBaseUnknown_var* second = nullptr;
-    info->GetSecondItemList(second);
-    append(second, station ? QELIListZitBltItemState::Listed : QELIListZitBltItemState::Direct);
+    info->AppendSecondItemList(objects);
+    append(station ? QELIListZitBltItemState::Listed : QELIListZitBltItemState::Direct);
   }
   rep->SetScrollRange(appended + kSpareRange);
   rep->DrawScrollList();

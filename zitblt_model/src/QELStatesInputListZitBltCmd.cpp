@@ -28,26 +28,20 @@ void QELStatesInputListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep) {
     QELAppendAssignedInputs(flow.get(), assigned, rep, QELIListZitBltItemState::Direct);
     // What the sub-activities take from outside, once each.
     if (QELIBIWItemInfo_var info(GetOwner()); info) {
-      VORListValVORBaseUnknown_var* activities = nullptr;
-      VORListValVORBaseUnknown_var* covered = nullptr;
-      info->GetActivityList(activities);
-      info->GetCoveredItems(covered);
+      VORListValVORBaseUnknown_var activities;
+      VORListValVORBaseUnknown_var covered;
+      info->AppendActivityList(activities);
+      info->AppendCoveredItems(covered);
       std::unordered_set<const void*> skip;
-      if (covered != nullptr) {
-        for (const VORBaseUnknown_var& item : *covered)
-          skip.insert(item.Identity());
-      }
+      for (const VORBaseUnknown_var& item : covered)
+        skip.insert(item.Identity());
       VORListValVORBaseUnknown_var collected;
-      if (activities != nullptr) {
-        for (const VORBaseUnknown_var& activity : *activities)
-          GetFirstFirstAssignedItems(VORISPPActivity_var(activity), collected);
-      }
+      for (const VORBaseUnknown_var& activity : activities)
+        GetFirstFirstAssignedItems(VORISPPActivity_var(activity), collected);
       for (const VORBaseUnknown_var& item : collected) {
         if (VORISPPItem_var(item) && skip.insert(item.Identity()).second)
           rep->AppendItem(item.get(), QELIListZitBltItemState::Listed);
       }
-      delete activities;
-      delete covered;
     }
   }
   rep->DrawScrollList();

@@ -15,15 +15,13 @@ void QELStatesResourceListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep)
     return;
   rep->RemoveAllItems(1);
   VORISPPResourceManagement_var resources(GetOwner());
-  VORListValVORBaseUnknown_var* assigned = nullptr;
-  if (resources && SUCCEEDED(resources->GetResources(assigned, "Resource")) &&
-      assigned != nullptr) {
-    for (const VORBaseUnknown_var& resource : *assigned) {
+  VORListValVORBaseUnknown_var assigned;
+  if (resources && SUCCEEDED(resources->AppendResources(assigned, "Resource"))) {
+    for (const VORBaseUnknown_var& resource : assigned) {
       if (VORISPPItem_var(resource))
         rep->AppendItem(resource.get(), QELIListZitBltItemState::NoState);
     }
   }
-  delete assigned;
   rep->DrawScrollList();
 }
 

@@ -28,6 +28,12 @@ class QELIBIWItemInfo : public virtual VORBaseUnknown {
   // produce (intermediate results made inside) and the items the activity takes through a
   // product input of its own and has assigned (listed already), without duplicates.
   virtual HRESULT GetCoveredItems(VORListValVORBaseUnknown_var*& items) = 0;
+  // The four above appended to a list the caller holds (and may reuse): the ZitBlt lists of
+  // every station read them when a level opens.
+  virtual HRESULT AppendFirstItemList(VORListValVORBaseUnknown_var& items) = 0;
+  virtual HRESULT AppendSecondItemList(VORListValVORBaseUnknown_var& items) = 0;
+  virtual HRESULT AppendActivityList(VORListValVORBaseUnknown_var& activities) = 0;
+  virtual HRESULT AppendCoveredItems(VORListValVORBaseUnknown_var& items) = 0;
   // The items consumed inside: the items of the product inputs of the activity and its
   // children, without duplicates.
   virtual HRESULT GetConsumedItems(VORListValVORBaseUnknown_var*& items) = 0;

@@ -36,6 +36,8 @@ class VORISPPFlowMgt : public virtual VORBaseUnknown {
   // VORISPPProductIO), new lists the caller deletes, in creation order.
   virtual HRESULT GetProductInputs(VORListValVORBaseUnknown_var*& inputs) = 0;
   virtual HRESULT GetProductOutputs(VORListValVORBaseUnknown_var*& outputs) = 0;
+  // As GetProductInputs, appended to a list the caller holds (untouched on failure).
+  virtual HRESULT AppendProductInputs(VORListValVORBaseUnknown_var& inputs) = 0;
   // Inputs then outputs.
   virtual HRESULT GetProductIOs(VORListValVORBaseUnknown_var*& productIOs) = 0;
   // item: a product or a manufacturing assembly of the same document. Emits kind 29.

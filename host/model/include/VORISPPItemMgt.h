@@ -16,6 +16,10 @@ class VORISPPItemMgt : public virtual VORBaseUnknown {
   // "QELMfgAssy") to keep only items of that kind.
   virtual HRESULT GetAssignedItems(VORListValVORBaseUnknown_var*& items, const char* type = "Item",
                                    int mode = AssignedHere) = 0;
+  // As GetAssignedItems, appended to a list the caller holds (duplicates are only looked for
+  // among the items appended).
+  virtual HRESULT AppendAssignedItems(VORListValVORBaseUnknown_var& items,
+                                      const char* type = "Item", int mode = AssignedHere) = 0;
   virtual bool IsItemAssigned(VORBaseUnknown* item) = 0;
   // Assigns item (optionally through one of this activity's product inputs). S_FALSE when it
   // is already assigned. Emits kind 17.

@@ -2,6 +2,7 @@
 #include "VORModelObjects.h"
 
 #include <algorithm>
+#include <unordered_map>
 #include <unordered_set>
 
 #include "VORLateTypes.h"
@@ -62,7 +63,13 @@ void VORModelObject::DispatchEventKeyed(const void* key, const char* event,
 }
 
 HRESULT VORModelObject::GetTypeName(VORUnicodeString& typeName) {
-  typeName = VORUnicodeString(lateType);
+  // A model has a handful of late types, asked for again and again: each is decoded once and
+  // then shared (copies of a string share its code points).
+  thread_local std::unordered_map<std::string, VORUnicodeString> decoded;
+  auto it = decoded.find(lateType);
+  if (it == decoded.end())
+    it = decoded.emplace(lateType, VORUnicodeString(lateType)).first;
+  typeName = it->second;
   return S_OK;
 }
 
@@ -229,13 +236,19 @@ HRESULT VORGraphNodeImpl::RemoveLink(VORBaseUnknown* other) {
 
 HRESULT VORGraphNodeImpl::GetProductInputs(VORListValVORBaseUnknown_var*& list) {
   list = nullptr;
+  if (AsActivity() == nullptr)
+    return E_NOTIMPL;
+  list = VORNewList();
+  return AppendProductInputs(*list);
+}
+
+HRESULT VORGraphNodeImpl::AppendProductInputs(VORListValVORBaseUnknown_var& list) {
   VORActivityImpl* a = AsActivity();
   if (a == nullptr)
     return E_NOTIMPL;
-  list = VORNewList();
   for (auto& io : a->productIOs) {
     if (io->input)
-      list->Append(VORBaseUnknown_var(static_cast<VORISPPProductIO*>(io.get())));
+      list.Append(VORBaseUnknown_var(static_cast<VORISPPProductIO*>(io.get())));
   }
   return S_OK;
 }
@@ -381,12 +394,17 @@ HRESULT VORActivityImpl::RemoveChild(VORBaseUnknown* child) {
 HRESULT VORActivityImpl::GetAssignedItems(VORListValVORBaseUnknown_var*& items, const char* type,
                                           int mode) {
   items = VORNewList();
+  return AppendAssignedItems(*items, type, mode);
+}
+
+HRESULT VORActivityImpl::AppendAssignedItems(VORListValVORBaseUnknown_var& items, const char* type,
+                                             int mode) {
   std::unordered_set<const void*> seen;
   const char* filter = (type == nullptr || *type == '\0') ? VORModelFilters::Item : type;
   auto collect = [&](VORActivityImpl* a) {
     for (const VORModelLink& l : a->out) {
       if (l.type == VORILinkableObject::ItemLink && VORMatchesFilter(l.target, filter))
-        AppendUnique(*items, seen, l.target);
+        AppendUnique(items, seen, l.target);
     }
   };
   collect(this);
@@ -436,6 +454,11 @@ HRESULT VORActivityImpl::GetAssignmentInput(VORBaseUnknown* item, VORBaseUnknown
 HRESULT VORActivityImpl::GetResources(VORListValVORBaseUnknown_var*& resources,
                                       const char* filter) {
   resources = VORNewList();
+  return AppendResources(*resources, filter);
+}
+
+HRESULT VORActivityImpl::AppendResources(VORListValVORBaseUnknown_var& resources,
+                                         const char* filter) {
   const bool all =
       filter == nullptr || *filter == '\0' || std::string(filter) == VORModelFilters::Resource;
   for (const VORModelLink& l : out) {
@@ -443,7 +466,7 @@ HRESULT VORActivityImpl::GetResources(VORListValVORBaseUnknown_var*& resources,
       continue;
     auto* p = static_cast<VORProductImpl*>(l.target);
     if (all || p->resourceClass == VORUnicodeString(filter))
-      resources->Append(VORBaseUnknown_var(static_cast<VORIProduct*>(p)));
+      resources.Append(VORBaseUnknown_var(static_cast<VORIProduct*>(p)));
   }
   return S_OK;
 }

@@ -126,6 +126,7 @@ class VORGraphNodeImpl : public VORModelObject,
   HRESULT AddNextActivity(VORBaseUnknown* nextNode) override;
   HRESULT RemoveLink(VORBaseUnknown* other) override;
   HRESULT GetProductInputs(VORListValVORBaseUnknown_var*& inputs) override;
+  HRESULT AppendProductInputs(VORListValVORBaseUnknown_var& inputs) override;
   HRESULT GetProductOutputs(VORListValVORBaseUnknown_var*& outputs) override;
   HRESULT GetProductIOs(VORListValVORBaseUnknown_var*& productIOs) override;
   HRESULT AddProductInput(VORBaseUnknown* item, VORBaseUnknown_var& productInput) override;
@@ -193,12 +194,15 @@ class VORActivityImpl : public VORGraphNodeImpl,
   // VORISPPItemMgt
   HRESULT GetAssignedItems(VORListValVORBaseUnknown_var*& items, const char* type,
                            int mode) override;
+  HRESULT AppendAssignedItems(VORListValVORBaseUnknown_var& items, const char* type,
+                              int mode) override;
   bool IsItemAssigned(VORBaseUnknown* item) override;
   HRESULT AssignItem(VORBaseUnknown* item, VORBaseUnknown* productInput) override;
   HRESULT UnassignItem(VORBaseUnknown* item) override;
   HRESULT GetAssignmentInput(VORBaseUnknown* item, VORBaseUnknown_var& productInput) override;
   // VORISPPResourceManagement
   HRESULT GetResources(VORListValVORBaseUnknown_var*& resources, const char* filter) override;
+  HRESULT AppendResources(VORListValVORBaseUnknown_var& resources, const char* filter) override;
   HRESULT AssignResource(VORBaseUnknown* resource) override;
   HRESULT UnassignResource(VORBaseUnknown* resource) override;
   // VORIUserAttributes
@@ -232,6 +236,10 @@ class VORBIWItemInfoImpl : public virtual QELIBIWItemInfo {
   HRESULT GetSecondItemList(VORListValVORBaseUnknown_var*& items) override;
   HRESULT GetActivityList(VORListValVORBaseUnknown_var*& activities) override;
   HRESULT GetCoveredItems(VORListValVORBaseUnknown_var*& items) override;
+  HRESULT AppendFirstItemList(VORListValVORBaseUnknown_var& items) override;
+  HRESULT AppendSecondItemList(VORListValVORBaseUnknown_var& items) override;
+  HRESULT AppendActivityList(VORListValVORBaseUnknown_var& activities) override;
+  HRESULT AppendCoveredItems(VORListValVORBaseUnknown_var& items) override;
   HRESULT GetConsumedItems(VORListValVORBaseUnknown_var*& items) override;
   HRESULT GetReplaceableProductIOs(VORListValVORBaseUnknown_var*& productIOs) override;
   bool IsListedOutput(VORBaseUnknown* productOutput) override;

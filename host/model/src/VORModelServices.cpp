@@ -25,6 +25,13 @@ std::vector<VORActivityImpl*> ChildActivities(VORActivityImpl* a) {
   }
   return result;
 }
+bool HasChildActivity(VORActivityImpl* a) {
+  for (auto& c : a->children) {
+    if (c->AsActivity() != nullptr)
+      return true;
+  }
+  return false;
+}
 void AppendIO(VORListValVORBaseUnknown_var& list, VORProductIOImpl* io) {
   list.Append(VORBaseUnknown_var(static_cast<VORISPPProductIO*>(io)));
 }
@@ -32,16 +39,36 @@ void AppendIO(VORListValVORBaseUnknown_var& list, VORProductIOImpl* io) {
 
 HRESULT VORBIWItemInfoImpl::GetFirstItemList(VORListValVORBaseUnknown_var*& items) {
   items = VORNewList();
-  for (auto& io : Self()->productIOs) {
-    if (!io->input)
-      AppendIO(*items, io.get());
-  }
-  return S_OK;
+  return AppendFirstItemList(*items);
 }
 
 HRESULT VORBIWItemInfoImpl::GetSecondItemList(VORListValVORBaseUnknown_var*& items) {
   items = VORNewList();
+  return AppendSecondItemList(*items);
+}
+
+HRESULT VORBIWItemInfoImpl::GetActivityList(VORListValVORBaseUnknown_var*& activities) {
+  activities = VORNewList();
+  return AppendActivityList(*activities);
+}
+
+HRESULT VORBIWItemInfoImpl::GetCoveredItems(VORListValVORBaseUnknown_var*& items) {
+  items = VORNewList();
+  return AppendCoveredItems(*items);
+}
+
+HRESULT VORBIWItemInfoImpl::AppendFirstItemList(VORListValVORBaseUnknown_var& items) {
+  for (auto& io : Self()->productIOs) {
+    if (!io->input)
+      AppendIO(items, io.get());
+  }
+  return S_OK;
+}
+
+HRESULT VORBIWItemInfoImpl::AppendSecondItemList(VORListValVORBaseUnknown_var& items) {
   VORActivityImpl* self = Self();
+  if (!HasChildActivity(self))
+    return S_OK;  // only children hand anything on
   std::unordered_set<VORModelObject*> consumed;
   auto addConsumed = [&](VORActivityImpl* a) {
     for (auto& io : a->productIOs) {
@@ -61,37 +88,47 @@ HRESULT VORBIWItemInfoImpl::GetSecondItemList(VORListValVORBaseUnknown_var*& ite
   for (VORActivityImpl* c : children) {
     for (auto& io : c->productIOs) {
       if (!io->input && io->Item() && consumed.insert(io->Item()).second)
-        AppendIO(*items, io.get());
+        AppendIO(items, io.get());
     }
   }
   return S_OK;
 }
 
-HRESULT VORBIWItemInfoImpl::GetActivityList(VORListValVORBaseUnknown_var*& activities) {
-  activities = VORNewList();
-  const auto children = ChildActivities(Self());
-  if (children.empty() && VORKindCast<VORStationImpl>(Self()))
-    activities->Append(VORBaseUnknown_var(Unk(Self())));
-  for (VORActivityImpl* c : children)
-    activities->Append(VORBaseUnknown_var(Unk(c)));
+HRESULT VORBIWItemInfoImpl::AppendActivityList(VORListValVORBaseUnknown_var& activities) {
+  VORActivityImpl* self = Self();
+  if (!HasChildActivity(self)) {
+    if (VORKindCast<VORStationImpl>(self))
+      activities.Append(VORBaseUnknown_var(Unk(self)));
+    return S_OK;
+  }
+  for (auto& c : self->children) {
+    if (VORActivityImpl* ca = c->AsActivity())
+      activities.Append(VORBaseUnknown_var(Unk(ca)));
+  }
   return S_OK;
 }
 
-HRESULT VORBIWItemInfoImpl::GetCoveredItems(VORListValVORBaseUnknown_var*& items) {
-  items = VORNewList();
+HRESULT VORBIWItemInfoImpl::AppendCoveredItems(VORListValVORBaseUnknown_var& items) {
   VORActivityImpl* self = Self();
   std::unordered_set<VORModelObject*> seen;
   auto add = [&](VORModelObject* item) {
     if (item != nullptr && seen.insert(item).second)
-      items->Append(VORBaseUnknown_var(Unk(item)));
+      items.Append(VORBaseUnknown_var(Unk(item)));
   };
-  auto children = ChildActivities(self);
-  if (children.empty() && VORKindCast<VORStationImpl>(self))
-    children.push_back(self);  // the activity list of a station without children
-  for (VORActivityImpl* a : children) {
+  auto addOutputsOf = [&](VORActivityImpl* a) {
     for (auto& io : a->productIOs) {
       if (!io->input)
         add(io->Item());
+    }
+  };
+  // The listed activities: the children, or a station without children itself.
+  if (!HasChildActivity(self)) {
+    if (VORKindCast<VORStationImpl>(self))
+      addOutputsOf(self);
+  } else {
+    for (auto& c : self->children) {
+      if (VORActivityImpl* ca = c->AsActivity())
+        addOutputsOf(ca);
     }
   }
   for (auto& io : self->productIOs) {

@@ -30,6 +30,8 @@ HRESULT VORModelDoor::SetZitBltShown(VORBaseUnknown* activityObject, const VORUn
 }
 
 HRESULT VORActivityImpl::GetZitBltShown(const VORUnicodeString& name, bool& shown) {
+  if (zitBltShown.empty())
+    return S_FALSE;  // most activities record nothing: no key to build
   auto it = zitBltShown.find(name.ConvertToUTF8());
   if (it == zitBltShown.end())
     return S_FALSE;
