@@ -123,8 +123,11 @@ void QELEZitBltCBSubscriber::CreateUpdateCommands() {
   VORIDOMDocument_var document;
   if (!manager || !manager->LoadConfiguration(document) || !document)
     return;
-  for (const QELZitBltDefinition& d :
-       QELZitBltConfiguration::DefinitionsForActivity(document, activity)) {
+  const std::vector<QELZitBltDefinition>& definitions =
+      QELZitBltConfiguration::DefinitionsForActivity(document, activity);
+  if (_commands.empty())
+    _commands.reserve(definitions.size());
+  for (const QELZitBltDefinition& d : definitions) {
     if (!d.hasUpdateData)
       continue;
     VORCommand* created = QELZitBltCommandFactory::CreateUpdateCommand(d, activity);

@@ -5,6 +5,7 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 
 #include "VORExtension.h"
 
@@ -20,7 +21,7 @@ struct Entry {
   VORExtensionKind kind = VORExtensionKind::Data;
 };
 // Null factory when no extension answers iid for lateType or its ancestors.
-Entry Find(const std::string& lateType, const VORInterfaceId& iid);
+Entry Find(std::string_view lateType, const VORInterfaceId& iid);
 
 // Reads the module dictionary: lines "<late type> <interface> <module>", '#' starts a comment.
 // Returns false (and keeps the previous dictionary) when the file cannot be read.

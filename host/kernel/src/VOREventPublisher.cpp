@@ -21,12 +21,50 @@ struct VOREventPublisher::Entry {
   bool removed = false;
 };
 
+namespace {
+// The callbacks filed under one key, in registration order. A key has one callback nearly
+// always (a subscriber's own activity): that one needs no block of its own.
+template <class EntryPtr>
+class KeyedEntries {
+ public:
+  void Add(EntryPtr entry) {
+    if (!_first)
+      _first = std::move(entry);
+    else
+      _rest.push_back(std::move(entry));
+  }
+  void Erase(const EntryPtr& entry) {
+    if (_first != entry) {
+      std::erase(_rest, entry);
+    } else if (_rest.empty()) {
+      _first.reset();
+    } else {
+      _first = std::move(_rest.front());
+      _rest.erase(_rest.begin());
+    }
+  }
+  bool Empty() const { return !_first; }
+  size_t Size() const { return _first ? 1 + _rest.size() : 0; }
+  template <class F>
+  void ForEach(F&& f) const {
+    if (_first)
+      f(_first);
+    for (const EntryPtr& e : _rest)
+      f(e);
+  }
+
+ private:
+  EntryPtr _first;
+  std::vector<EntryPtr> _rest;
+};
+}  // namespace
+
 // The callbacks of one name, each list in registration order (ids grow with every addition).
 struct VOREventPublisher::Channel {
   std::string name;
   std::vector<EntryPtr> unkeyed;
   size_t unkeyedRemoved = 0;  // flagged removed, not yet erased
-  std::unordered_map<const void*, std::vector<EntryPtr>> byKey;
+  std::unordered_map<const void*, KeyedEntries<EntryPtr>> byKey;
 };
 
 namespace {
@@ -73,7 +111,7 @@ VORCallbackId VOREventPublisher::Add(const void* key, const std::string& name,
   // Most publishers hold a handful of callbacks: one block for the first few, not one per
   // doubling.
   if (key != nullptr) {
-    channel->byKey[key].push_back(entry);
+    channel->byKey[key].Add(entry);
   } else {
     if (channel->unkeyed.empty())
       channel->unkeyed.reserve(4);
@@ -111,8 +149,8 @@ void VOREventPublisher::Forget(const EntryPtr& entry) {
   if (entry->key != nullptr) {
     // One key's list is short: erase at once (running dispatches work on their own list).
     auto list = channel->byKey.find(entry->key);
-    std::erase(list->second, entry);
-    if (list->second.empty())
+    list->second.Erase(entry);
+    if (list->second.Empty())
       channel->byKey.erase(list);
   } else if (++channel->unkeyedRemoved * 2 >= channel->unkeyed.size()) {
     // Erase in bulk once half are gone: removing n callbacks one by one stays linear.
@@ -186,24 +224,32 @@ int VOREventPublisher::Run(const std::string& event, VORNotification* notificati
   due.swap(_due[static_cast<size_t>(_running - 1)]);
   due.clear();
   int lists = 0;
+  auto keep = [&](const EntryPtr& e) {
+    if (!e->removed)
+      due.push_back(e.get());
+  };
   auto append = [&](const std::vector<EntryPtr>& list) {
     if (list.empty())
       return;
     ++lists;
-    for (const EntryPtr& e : list) {
-      if (!e->removed)
-        due.push_back(e.get());
-    }
+    for (const EntryPtr& e : list)
+      keep(e);
+  };
+  auto appendKeyed = [&](const KeyedEntries<EntryPtr>& list) {
+    if (list.Empty())
+      return;
+    ++lists;
+    list.ForEach(keep);
   };
   for (size_t i = 0; i < channelCount; ++i) {
     Channel* c = channels[i];
     append(c->unkeyed);
     if (keyed) {
       if (auto it = c->byKey.find(key); it != c->byKey.end())
-        append(it->second);
+        appendKeyed(it->second);
     } else {
       for (const auto& [k, list] : c->byKey)
-        append(list);
+        appendKeyed(list);
     }
   }
   if (lists > 1)
@@ -236,7 +282,17 @@ int VOREventPublisher::Dispatch(const std::string& event, VORNotification* notif
 }
 
 int VOREventPublisher::Dispatch(VORNotification* notification) {
-  return notification ? Dispatch(notification->IsA(), notification) : 0;
+  if (notification == nullptr)
+    return 0;
+  // Class names are literals: each becomes the event's string once, not on every dispatch.
+  thread_local std::unordered_map<const char*, std::string> eventNames;
+  const char* className = notification->IsA();
+  auto it = eventNames.find(className);
+  if (it == eventNames.end())
+    it = eventNames.emplace(className, className).first;
+  else if (it->second != className)
+    return Dispatch(std::string(className), notification);  // not a literal after all
+  return Dispatch(it->second, notification);
 }
 
 int VOREventPublisher::DispatchKeyed(const void* key, const std::string& event,
@@ -261,5 +317,5 @@ int VOREventPublisher::KeyedCallbackCount(const void* key, const std::string& na
   if (channel == nullptr)
     return 0;
   auto it = channel->byKey.find(key);
-  return it == channel->byKey.end() ? 0 : static_cast<int>(it->second.size());
+  return it == channel->byKey.end() ? 0 : static_cast<int>(it->second.Size());
 }

@@ -3,6 +3,7 @@
 #include <fstream>
 #include <map>
 #include <sstream>
+#include <string_view>
 #include <utility>
 
 #include "VOREnv.h"
@@ -12,13 +13,25 @@
 namespace {
 using Key = std::pair<std::string, std::string>;  // late type, interface name
 
+// Orders keys and (late type, interface) views alike: a query builds no strings.
+struct KeyLess {
+  using is_transparent = void;
+  using View = std::pair<std::string_view, std::string_view>;
+  static View AsView(const Key& k) { return {k.first, k.second}; }
+  static View AsView(const View& v) { return v; }
+  template <class A, class B>
+  bool operator()(const A& a, const B& b) const {
+    return AsView(a) < AsView(b);
+  }
+};
+
 std::map<Key, VORExtensionRegistry::Entry>& Entries() {
   static std::map<Key, VORExtensionRegistry::Entry> entries;
   return entries;
 }
 // Answers of Find, good until the next registration or dictionary change.
-std::map<Key, VORExtensionRegistry::Entry>& Answers() {
-  static std::map<Key, VORExtensionRegistry::Entry> answers;
+std::map<Key, VORExtensionRegistry::Entry, KeyLess>& Answers() {
+  static std::map<Key, VORExtensionRegistry::Entry, KeyLess> answers;
   return answers;
 }
 std::map<Key, std::string>& Dictionary() {
@@ -52,11 +65,11 @@ void Unregister(const std::string& lateType, const VORInterfaceId& iid) {
 
 static Entry Resolve(const std::string& lateType, const std::string& name);
 
-Entry Find(const std::string& lateType, const VORInterfaceId& iid) {
-  Key key{lateType, std::string(iid.name)};
-  if (auto it = Answers().find(key); it != Answers().end())
+Entry Find(std::string_view lateType, const VORInterfaceId& iid) {
+  if (auto it = Answers().find(KeyLess::View(lateType, iid.name)); it != Answers().end())
     return it->second;
-  Entry answer = Resolve(lateType, key.second);
+  Key key{std::string(lateType), std::string(iid.name)};
+  Entry answer = Resolve(key.first, key.second);
   Answers()[std::move(key)] = answer;
   return answer;
 }
