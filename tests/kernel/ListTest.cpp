@@ -1,6 +1,10 @@
+#include <algorithm>
+#include <vector>
+
 #include <gtest/gtest.h>
 
 #include "VORLists.h"
+#include "VORSmallSet.h"
 
 namespace {
 
@@ -60,6 +64,21 @@ TEST(ListTest, RemoveDuplicatesKeepsTheFirstOccurrenceInOrder) {
     names.Append(n);
   names.RemoveDuplicates();
   EXPECT_EQ(names.Size(), 2);
+
+  // Short lists are compared in place, long ones through a set: both keep the same values.
+  for (int length : {16, 17, 40}) {
+    VORRawCollint numbers;
+    for (int i = 0; i < length; ++i)
+      numbers.Append((i * 7) % 11);
+    numbers.RemoveDuplicates();
+    std::vector<int> kept(numbers.begin(), numbers.end());
+    std::vector<int> expected;
+    for (int i = 0; i < length; ++i) {
+      if (std::find(expected.begin(), expected.end(), (i * 7) % 11) == expected.end())
+        expected.push_back((i * 7) % 11);
+    }
+    EXPECT_EQ(kept, expected) << length;
+  }
 }
 
 TEST(ListTest, IntersectionFollowsTheReceiversOrderAndAppends) {
@@ -96,6 +115,21 @@ TEST(ListDeathTest, PositionOutOfRangeIsFatalWithTheCondition) {
   ints.Append(1);
   EXPECT_DEATH(ints[0], "AssertionFailed:position >= 1");
   EXPECT_DEATH(ints.RemovePosition(2), "AssertionFailed:position >= 1 && position <= Size\\(\\)");
+}
+
+TEST(SmallSetTest, AnswersAlikeInlineAndOnceItHashes) {
+  VORSmallSet<int, 4> set;
+  std::vector<int> inserted;
+  for (int i = 0; i < 30; ++i) {
+    const int value = (i * 5) % 13;
+    const bool fresh = std::find(inserted.begin(), inserted.end(), value) == inserted.end();
+    EXPECT_EQ(set.Insert(value), fresh) << i;
+    if (fresh)
+      inserted.push_back(value);
+    EXPECT_TRUE(set.Contains(value));
+    EXPECT_EQ(set.Size(), inserted.size());
+  }
+  EXPECT_FALSE(set.Contains(99));
 }
 
 }  // namespace

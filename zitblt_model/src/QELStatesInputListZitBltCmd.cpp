@@ -1,13 +1,12 @@
 #include "QELStatesInputListZitBltCmd.h"
 
-#include <unordered_set>
-
 #include "QELBaseScrollListZitBltRep.h"
 #include "QELIBIWItemInfo.h"
 #include "QELListZitBltCmdHelpers.h"
 #include "VORCommandHeader.h"
 #include "VORISPPItem.h"
 #include "VORISPPItemMgt.h"
+#include "VORSmallSet.h"
 
 bool QELStatesInputListZitBltCmd::HandleEvent(SPPModifyKind kind, VORBaseUnknown* son) {
   if (kind == SPPProductIOChanged)
@@ -32,14 +31,14 @@ void QELStatesInputListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep) {
       VORListValVORBaseUnknown_var covered;
       info->AppendActivityList(activities);
       info->AppendCoveredItems(covered);
-      std::unordered_set<const void*> skip;
+      VORSmallSet<const void*> skip;
       for (const VORBaseUnknown_var& item : covered)
-        skip.insert(item.Identity());
+        skip.Insert(item.Identity());
       VORListValVORBaseUnknown_var collected;
       for (const VORBaseUnknown_var& activity : activities)
         GetFirstFirstAssignedItems(VORISPPActivity_var(activity), collected);
       for (const VORBaseUnknown_var& item : collected) {
-        if (VORISPPItem_var(item) && skip.insert(item.Identity()).second)
+        if (VORISPPItem_var(item) && skip.Insert(item.Identity()))
           rep->AppendItem(item.get(), QELIListZitBltItemState::Listed);
       }
     }

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <algorithm>
+#include <cstddef>
 #include <unordered_set>
 #include <vector>
 
@@ -51,6 +52,22 @@ class VORList {
   // Keeps the first occurrence of every value, in order.
   template <class Hash = std::hash<T>>
   void RemoveDuplicates() {
+    if (_items.size() <= kCompareInPlace) {
+      // A short list (a ZitBlt's few rows) is compared in place: no set, no second vector.
+      size_t kept = 0;
+      for (size_t i = 0; i < _items.size(); ++i) {
+        bool seen = false;
+        for (size_t j = 0; j < kept && !seen; ++j)
+          seen = Equal()(_items[j], _items[i]);
+        if (seen)
+          continue;
+        if (kept != i)
+          _items[kept] = std::move(_items[i]);
+        ++kept;
+      }
+      _items.erase(_items.begin() + static_cast<std::ptrdiff_t>(kept), _items.end());
+      return;
+    }
     std::unordered_set<T, Hash, Equal> seen;
     std::vector<T> kept;
     kept.reserve(_items.size());
@@ -78,6 +95,9 @@ class VORList {
   void Reserve(int n) { _items.reserve(static_cast<size_t>(n)); }
 
  private:
+  // Lists up to this long drop duplicates by comparing each value with those kept.
+  static constexpr size_t kCompareInPlace = 16;
+
   size_t Index(int position) const {
     VOR_ASSERT(position >= 1 && position <= Size());
     return static_cast<size_t>(position - 1);

@@ -102,7 +102,7 @@ void VORUnicodeString::Shrink(size_t size) noexcept {
   }
   // Few enough to live inline after all (several bytes per code point).
   Block* block = GetBlock();
-  char32_t kept[kInline];
+  char32_t kept[kInline] = {};
   std::copy_n(block->Chars(), size, kept);
   block->Drop();
   std::copy_n(kept, kInline, _inline);

@@ -3,9 +3,9 @@
 
 #include <algorithm>
 #include <unordered_map>
-#include <unordered_set>
 
 #include "VORLateTypes.h"
+#include "VORSmallSet.h"
 
 VORListValVORBaseUnknown_var* VORNewList() {
   return new VORListValVORBaseUnknown_var();
@@ -32,9 +32,9 @@ namespace {
 VORModelDoor* DoorOf(VORModelObject* o) {
   return o->data ? &o->data->door : nullptr;
 }
-void AppendUnique(VORListValVORBaseUnknown_var& list, std::unordered_set<const void*>& seen,
+void AppendUnique(VORListValVORBaseUnknown_var& list, VORSmallSet<const void*>& seen,
                   VORModelObject* o) {
-  if (seen.insert(o).second)
+  if (seen.Insert(o))
     list.Append(VORBaseUnknown_var(static_cast<VORISpecObject*>(o)));
 }
 }  // namespace
@@ -79,7 +79,7 @@ VORProcess* VORModelObject::GetDocument() {
 
 HRESULT VORModelObject::GetLinkedObjects(VORListValVORBaseUnknown_var*& objects, const char* type) {
   objects = VORNewList();
-  std::unordered_set<const void*> seen;
+  VORSmallSet<const void*> seen;
   for (const VORModelLink& l : out) {
     if (type == nullptr || *type == '\0' || l.type == type)
       AppendUnique(*objects, seen, l.target);
@@ -94,7 +94,7 @@ HRESULT VORModelObject::GetLinkedObjects(VORListValVORBaseUnknown_var*& objects,
 HRESULT VORModelObject::GetPointingObjects(VORListValVORBaseUnknown_var*& objects,
                                            const char* type) {
   objects = VORNewList();
-  std::unordered_set<const void*> seen;
+  VORSmallSet<const void*> seen;
   for (VORModelObject* source : in) {
     if (type == nullptr || *type == '\0' || source->FindLink(this, type) != nullptr)
       AppendUnique(*objects, seen, source);
@@ -105,7 +105,7 @@ HRESULT VORModelObject::GetPointingObjects(VORListValVORBaseUnknown_var*& object
 HRESULT VORModelObject::GetPointedObjects(VORListValVORBaseUnknown_var*& objects,
                                           const char* type) {
   objects = VORNewList();
-  std::unordered_set<const void*> seen;
+  VORSmallSet<const void*> seen;
   for (const VORModelLink& l : out) {
     if (type == nullptr || *type == '\0' || l.type == type)
       AppendUnique(*objects, seen, l.target);
@@ -399,7 +399,7 @@ HRESULT VORActivityImpl::GetAssignedItems(VORListValVORBaseUnknown_var*& items, 
 
 HRESULT VORActivityImpl::AppendAssignedItems(VORListValVORBaseUnknown_var& items, const char* type,
                                              int mode) {
-  std::unordered_set<const void*> seen;
+  VORSmallSet<const void*> seen;
   const char* filter = (type == nullptr || *type == '\0') ? VORModelFilters::Item : type;
   auto collect = [&](VORActivityImpl* a) {
     for (const VORModelLink& l : a->out) {

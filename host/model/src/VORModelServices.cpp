@@ -1,10 +1,10 @@
 // The item bookkeeping of stations and groupings.
 #include <algorithm>
 #include <unordered_map>
-#include <unordered_set>
 
 #include "VORLateTypes.h"
 #include "VORModelObjects.h"
+#include "VORSmallSet.h"
 
 namespace {
 VORBaseUnknown* Unk(VORModelObject* o) {
@@ -69,11 +69,11 @@ HRESULT VORBIWItemInfoImpl::AppendSecondItemList(VORListValVORBaseUnknown_var& i
   VORActivityImpl* self = Self();
   if (!HasChildActivity(self))
     return S_OK;  // only children hand anything on
-  std::unordered_set<VORModelObject*> consumed;
+  VORSmallSet<VORModelObject*> consumed;
   auto addConsumed = [&](VORActivityImpl* a) {
     for (auto& io : a->productIOs) {
       if (io->input && io->Item())
-        consumed.insert(io->Item());
+        consumed.Insert(io->Item());
     }
   };
   addConsumed(self);
@@ -83,11 +83,11 @@ HRESULT VORBIWItemInfoImpl::AppendSecondItemList(VORListValVORBaseUnknown_var& i
   // What the activity declares itself is in the first list already.
   for (auto& io : self->productIOs) {
     if (!io->input && io->Item())
-      consumed.insert(io->Item());
+      consumed.Insert(io->Item());
   }
   for (VORActivityImpl* c : children) {
     for (auto& io : c->productIOs) {
-      if (!io->input && io->Item() && consumed.insert(io->Item()).second)
+      if (!io->input && io->Item() && consumed.Insert(io->Item()))
         AppendIO(items, io.get());
     }
   }
@@ -110,9 +110,9 @@ HRESULT VORBIWItemInfoImpl::AppendActivityList(VORListValVORBaseUnknown_var& act
 
 HRESULT VORBIWItemInfoImpl::AppendCoveredItems(VORListValVORBaseUnknown_var& items) {
   VORActivityImpl* self = Self();
-  std::unordered_set<VORModelObject*> seen;
+  VORSmallSet<VORModelObject*> seen;
   auto add = [&](VORModelObject* item) {
-    if (item != nullptr && seen.insert(item).second)
+    if (item != nullptr && seen.Insert(item))
       items.Append(VORBaseUnknown_var(Unk(item)));
   };
   auto addOutputsOf = [&](VORActivityImpl* a) {
@@ -140,13 +140,13 @@ HRESULT VORBIWItemInfoImpl::AppendCoveredItems(VORListValVORBaseUnknown_var& ite
 
 HRESULT VORBIWItemInfoImpl::GetConsumedItems(VORListValVORBaseUnknown_var*& items) {
   items = VORNewList();
-  std::unordered_set<VORModelObject*> seen;
+  VORSmallSet<VORModelObject*> seen;
   std::vector<VORActivityImpl*> all{Self()};
   for (VORActivityImpl* c : ChildActivities(Self()))
     all.push_back(c);
   for (VORActivityImpl* a : all) {
     for (auto& io : a->productIOs) {
-      if (io->input && io->Item() && seen.insert(io->Item()).second)
+      if (io->input && io->Item() && seen.Insert(io->Item()))
         items->Append(VORBaseUnknown_var(Unk(io->Item())));
     }
   }
