@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "VORLists.h"
+#include "VORScratchList.h"
 #include "VORSmallSet.h"
 
 namespace {
@@ -130,6 +131,29 @@ TEST(SmallSetTest, AnswersAlikeInlineAndOnceItHashes) {
     EXPECT_EQ(set.Size(), inserted.size());
   }
   EXPECT_FALSE(set.Contains(99));
+}
+
+TEST(ScratchListTest, NestedBorrowersGetTheirOwnEmptyListAndReleaseWhatTheyHeld) {
+  VORBaseUnknown_var a = MakeNode();
+  VORListValVORBaseUnknown_var* first = nullptr;
+  {
+    VORScratchList outer;
+    first = &*outer;
+    outer->Append(a);
+    {
+      VORScratchList inner;
+      EXPECT_NE(&*inner, &*outer);
+      EXPECT_TRUE(inner->IsEmpty());
+      inner->Append(a);
+    }
+    EXPECT_EQ(outer->Size(), 1);
+  }
+  // What the borrowers held is released with their scope; a list given back comes back empty.
+  EXPECT_EQ(a->AddRef(), 2u);
+  a->Release();
+  VORScratchList again;
+  EXPECT_TRUE(again->IsEmpty());
+  EXPECT_EQ(&*again, first) << "the most recently returned list is reused";
 }
 
 }  // namespace

@@ -4,6 +4,7 @@
 #include "VORISPPItem.h"
 #include "VORISPPProductIO.h"
 #include "VORISpecObject.h"
+#include "VORScratchList.h"
 
 VORUnicodeString QELTypeNameOf(VORBaseUnknown* object) {
   VORUnicodeString typeName;
@@ -26,10 +27,10 @@ bool QELIsItemOfType(VORBaseUnknown* object, std::initializer_list<const char*> 
 void QELAppendAssignedInputs(VORISPPFlowMgt* flow, VORListValVORBaseUnknown_var& assigned,
                              QELBaseScrollListZitBltRep* rep,
                              QELIListZitBltItemState::AssignState state) {
-  VORListValVORBaseUnknown_var inputs;
-  if (flow == nullptr || FAILED(flow->AppendProductInputs(inputs)))
+  VORScratchList inputs;
+  if (flow == nullptr || FAILED(flow->AppendProductInputs(*inputs)))
     return;
-  for (const VORBaseUnknown_var& input : inputs) {
+  for (const VORBaseUnknown_var& input : *inputs) {
     VORISPPProductIO_var io(input);
     VORBaseUnknown_var item;
     if (io)

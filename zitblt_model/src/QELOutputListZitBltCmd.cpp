@@ -4,6 +4,7 @@
 #include "QELIBIWItemInfo.h"
 #include "QELListZitBltCmdHelpers.h"
 #include "VORCommandHeader.h"
+#include "VORScratchList.h"
 
 namespace {
 // Room left below the outputs: the list of an output ZitBlt never scrolls.
@@ -29,19 +30,19 @@ void QELOutputListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep) {
   }
   int appended = 0;
   // One list for both item lists, emptied in between.
-  VORListValVORBaseUnknown_var objects;
+  VORScratchList objects;
   auto append = [&](QELIListZitBltItemState::AssignState state) {
-    for (const VORBaseUnknown_var& object : objects) {
+    for (const VORBaseUnknown_var& object : *objects) {
       rep->AppendItem(object.get(), state);
       ++appended;
     }
-    objects.RemoveAll();
+    objects->RemoveAll();
   };
   if (QELIBIWItemInfo_var info(GetOwner()); info) {
-    info->AppendFirstItemList(objects);
+    info->AppendFirstItemList(*objects);
     append(QELIListZitBltItemState::Listed);
     // What a grouping hands on from its sub-activities is marked; a station's is not.
-    info->AppendSecondItemList(objects);
+    info->AppendSecondItemList(*objects);
     append(station ? QELIListZitBltItemState::Listed : QELIListZitBltItemState::Direct);
   }
   rep->SetScrollRange(appended + kSpareRange);

@@ -3,6 +3,7 @@
 #include "QELBaseScrollListZitBltRep.h"
 #include "QELListZitBltCmdHelpers.h"
 #include "VORCommandHeader.h"
+#include "VORScratchList.h"
 
 bool QELStatesInputLeafListZitBltCmd::HandleEvent(SPPModifyKind kind, VORBaseUnknown* son) {
   return (kind == SPPItemAssigned || kind == SPPItemUnassigned) &&
@@ -14,9 +15,9 @@ void QELStatesInputLeafListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep
     return;
   rep->RemoveAllItems(1);
   if (VORISPPFlowMgt_var flow(GetOwner()); flow) {
-    VORListValVORBaseUnknown_var assigned;
-    GetFirstFirstAssignedItems(VORISPPActivity_var(GetOwner()), assigned);
-    QELAppendAssignedInputs(flow.get(), assigned, rep, QELIListZitBltItemState::Listed);
+    VORScratchList assigned;
+    GetFirstFirstAssignedItems(VORISPPActivity_var(GetOwner()), *assigned);
+    QELAppendAssignedInputs(flow.get(), *assigned, rep, QELIListZitBltItemState::Listed);
   }
   rep->DrawScrollList();
 }

@@ -6,6 +6,7 @@
 #include "VORCommandHeader.h"
 #include "VORISPPItem.h"
 #include "VORISPPItemMgt.h"
+#include "VORScratchList.h"
 #include "VORSmallSet.h"
 
 bool QELStatesInputListZitBltCmd::HandleEvent(SPPModifyKind kind, VORBaseUnknown* son) {
@@ -22,22 +23,22 @@ void QELStatesInputListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep) {
   VORISPPFlowMgt_var flow(GetOwner());
   if (flow && VORISPPItemMgt_var(GetOwner())) {
     // The activity's own inputs.
-    VORListValVORBaseUnknown_var assigned;
-    GetFirstFirstAssignedItems(VORISPPActivity_var(GetOwner()), assigned);
-    QELAppendAssignedInputs(flow.get(), assigned, rep, QELIListZitBltItemState::Direct);
+    VORScratchList assigned;
+    GetFirstFirstAssignedItems(VORISPPActivity_var(GetOwner()), *assigned);
+    QELAppendAssignedInputs(flow.get(), *assigned, rep, QELIListZitBltItemState::Direct);
     // What the sub-activities take from outside, once each.
     if (QELIBIWItemInfo_var info(GetOwner()); info) {
-      VORListValVORBaseUnknown_var activities;
-      VORListValVORBaseUnknown_var covered;
-      info->AppendActivityList(activities);
-      info->AppendCoveredItems(covered);
+      VORScratchList activities;
+      VORScratchList covered;
+      info->AppendActivityList(*activities);
+      info->AppendCoveredItems(*covered);
       VORSmallSet<const void*> skip;
-      for (const VORBaseUnknown_var& item : covered)
+      for (const VORBaseUnknown_var& item : *covered)
         skip.Insert(item.Identity());
-      VORListValVORBaseUnknown_var collected;
-      for (const VORBaseUnknown_var& activity : activities)
-        GetFirstFirstAssignedItems(VORISPPActivity_var(activity), collected);
-      for (const VORBaseUnknown_var& item : collected) {
+      VORScratchList collected;
+      for (const VORBaseUnknown_var& activity : *activities)
+        GetFirstFirstAssignedItems(VORISPPActivity_var(activity), *collected);
+      for (const VORBaseUnknown_var& item : *collected) {
         if (VORISPPItem_var(item) && skip.Insert(item.Identity()))
           rep->AppendItem(item.get(), QELIListZitBltItemState::Listed);
       }

@@ -5,6 +5,7 @@
 #include "VORCommandHeader.h"
 #include "VORISPPItem.h"
 #include "VORISPPResourceManagement.h"
+#include "VORScratchList.h"
 
 bool QELStatesResourceListZitBltCmd::HandleEvent(SPPModifyKind kind, VORBaseUnknown*) {
   return kind == SPPResourceAssigned || kind == SPPResourceUnassigned;
@@ -15,9 +16,9 @@ void QELStatesResourceListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep)
     return;
   rep->RemoveAllItems(1);
   VORISPPResourceManagement_var resources(GetOwner());
-  VORListValVORBaseUnknown_var assigned;
-  if (resources && SUCCEEDED(resources->AppendResources(assigned, "Resource"))) {
-    for (const VORBaseUnknown_var& resource : assigned) {
+  VORScratchList assigned;
+  if (resources && SUCCEEDED(resources->AppendResources(*assigned, "Resource"))) {
+    for (const VORBaseUnknown_var& resource : *assigned) {
       if (VORISPPItem_var(resource))
         rep->AppendItem(resource.get(), QELIListZitBltItemState::NoState);
     }
