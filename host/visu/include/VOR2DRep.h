@@ -8,6 +8,7 @@
 #pragma once
 
 #include <functional>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -63,7 +64,7 @@ class VOR2DRep : public VORBaseUnknown {
   VORBaseUnknown* GetObject() const { return _object.get(); }
   // A role name ("PertNode", "PertLink" ...) carried into the render list and the SVG classes.
   void SetTag(const std::string& tag);
-  const std::string& GetTag() const { return _tag; }
+  const std::string& GetTag() const;
 
   VOR2DBagRep* GetFather() const { return _father; }
   // The manipulator acting on this rep, or null (set by the manipulator).
@@ -104,7 +105,8 @@ class VOR2DRep : public VORBaseUnknown {
   int _colorIndex = -1;
   int _lineThickness = 1;
   VORBaseUnknown_var _object;
-  std::string _tag;
+  // Few reps carry a tag: the others keep no string of their own.
+  std::unique_ptr<std::string> _tag;
   VOR2DBagRep* _father = nullptr;
   VORManipulator* _manipulator = nullptr;
   // Fathers' boxes only, for a rep whose own frame moved (its children's box stays valid).

@@ -16,6 +16,7 @@
 // left to the viewer as an ordinary selection pick (lists whose items are selected and dragged).
 #pragma once
 
+#include <memory>
 #include <vector>
 
 #include <absl/container/inlined_vector.h>
@@ -134,7 +135,7 @@ class VORManipulator : public VORCommand {
   // The notification of one gesture event, made on first use: a chart has thousands of
   // manipulators and most never see a gesture.
   VORManipulatorNotification* Notification(Slot slot) const;
-  mutable VORHandle<VORManipulatorNotification> _notifications[kSlotCount];
+  mutable std::unique_ptr<VORHandle<VORManipulatorNotification>[]> _notifications;
   VORViewer* _viewer = nullptr;
   VORHandle<VOR2DRep> _pressed_element;
   VORMathPoint2D _current;

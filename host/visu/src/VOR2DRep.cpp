@@ -51,8 +51,18 @@ void VOR2DRep::SetObject(VORBaseUnknown* object) {
 }
 
 void VOR2DRep::SetTag(const std::string& tag) {
-  _tag = tag;
+  if (tag.empty())
+    _tag.reset();
+  else if (_tag)
+    *_tag = tag;
+  else
+    _tag = std::make_unique<std::string>(tag);
   Touch();
+}
+
+const std::string& VOR2DRep::GetTag() const {
+  static const std::string kNone;
+  return _tag ? *_tag : kNone;
 }
 
 unsigned long long VOR2DRep::BoxesComputed() {
@@ -101,17 +111,21 @@ void VOR2DRep::Flatten(VORFlattenContext& context) const {
     return;
   const int savedColor = context.colorIndex;
   const int savedHighlight = context.highlight;
-  const std::string savedTag = context.tag;
   if (_colorIndex >= 0)
     context.colorIndex = _colorIndex;
   if (_object && context.highlightOf)
     context.highlight |= context.highlightOf(_object.get());
-  if (!_tag.empty())
-    context.tag = _tag;
+  // Only a tagged rep changes the context's tag, so only it puts the tag back.
+  std::string savedTag;
+  if (_tag) {
+    savedTag = context.tag;
+    context.tag = *_tag;
+  }
   FlattenShown(context);
   context.colorIndex = savedColor;
   context.highlight = savedHighlight;
-  context.tag = savedTag;
+  if (_tag)
+    context.tag = std::move(savedTag);
 }
 
 VORRenderItem& VOR2DRep::AddItem(VORFlattenContext& context, VORPrimitiveKind kind) const {

@@ -10,6 +10,8 @@ VORManipulator::VORManipulator(VORCommand* father, const VORString& name, int st
     : VORCommand(father, name), _style(style) {}
 
 VORManipulatorNotification* VORManipulator::Notification(Slot slot) const {
+  if (!_notifications)
+    _notifications = std::make_unique<VORHandle<VORManipulatorNotification>[]>(kSlotCount);
   VORHandle<VORManipulatorNotification>& notification = _notifications[slot];
   if (!notification) {
     static constexpr const char* kEvents[kSlotCount] = {
