@@ -229,6 +229,27 @@ TEST_F(ZitBltRepTest, BagsJoinTheCurrentEditorsInteractiveSetUntilTheRepGoes) {
   auto editor = VORFrmEditor_var::Adopt(new VORFrmEditor(doc));
   VORFrmEditor::SetCurrentEditor(editor);
   QELZitBltRep* rep = Make("lefttop");
+  QELZitBltRep* next = Make("righttop");
+  const VORListValVORBaseUnknown_var& models = editor->GetISO()->GetElements();
+  ASSERT_EQ(models.Size(), 4);
+  auto repOf = [&](int position) { return VORModelForRep2D_var(models[position])->GetRep(); };
+  // A closed ZitBlt has no expanded bag yet, but its model already holds the bag's place: the
+  // bag made when it opens is drawn and picked where it always was, before the next ZitBlt.
+  EXPECT_EQ(repOf(1), rep->GetZitBltBtn());
+  EXPECT_EQ(repOf(2), nullptr);
+  rep->SetPoDPosition(7.0, 3.0);
+  rep->ChangeBtnState();
+  VOR2DBagRep* expanded = rep->GetZitBltExpanded();
+  EXPECT_TRUE(expanded->IsShown());
+  EXPECT_EQ(repOf(2), expanded);
+  EXPECT_EQ(repOf(3), next->GetZitBltBtn());
+  double x = 0.0, y = 0.0;
+  expanded->GetMatrix()->GetTranslation(x, y);
+  EXPECT_EQ(x, 7.0);
+  EXPECT_EQ(y, 3.0);
+  next->RequestDelayedDestruction();
+  reps.pop_back();
+  VORDeferredDeletion::Drain();
   EXPECT_EQ(editor->GetISO()->GetElements().Size(), 2);
   rep->BuildRep(nullptr);  // a rebuild replaces the models
   EXPECT_EQ(editor->GetISO()->GetElements().Size(), 2);
