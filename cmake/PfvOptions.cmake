@@ -70,6 +70,7 @@ function(pfv_test name)
   pfv_init_main(main ${name} gtest ${ARG_INIT})
   add_executable(${name} ${ARG_SOURCES} ${main})
   target_link_libraries(${name} PRIVATE pfv_warnings GTest::gtest GTest::gmock ${ARG_LIBS})
+  pfv_use_product_heap(${name})
   set_target_properties(${name} PROPERTIES CROSSCOMPILING_EMULATOR
     "${CMAKE_COMMAND};-E;env;VORStartupPath=${PFV_RESOURCE_DIR};VOR_MODULE_PATH=${PFV_MODULE_DIR};VOR_USER_SETTINGS_DIR=${CMAKE_BINARY_DIR}/test-settings/${name};PFV_TEST_DATA=${CMAKE_SOURCE_DIR}/tests/data;PFV_EXAMPLES=${CMAKE_SOURCE_DIR}/examples;QT_QPA_PLATFORM=offscreen;ASAN_OPTIONS=detect_leaks=1")
   # Cases are listed when ctest starts (not after linking), with a generous time-out: a
@@ -85,6 +86,7 @@ function(pfv_bench name)
   pfv_init_main(main ${name} benchmark ${ARG_INIT})
   add_executable(${name} ${ARG_SOURCES} ${main})
   target_link_libraries(${name} PRIVATE pfv_warnings benchmark::benchmark ${ARG_LIBS})
+  pfv_use_product_heap(${name})
 endfunction()
 
 # pfv_check_headers(<name> <target> <folder>): every header of folder compiles on its own, with
