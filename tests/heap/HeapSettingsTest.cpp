@@ -8,6 +8,7 @@
 #include <cstdint>
 #include <cstdlib>
 #include <string>
+#include <sys/types.h>
 
 namespace {
 
@@ -24,6 +25,17 @@ TEST(HeapSettings, HugePagesForObjectsAndMetadata) {
     GTEST_SKIP() << "MALLOC_CONF overrides the built-in settings";
   EXPECT_EQ(StringOption("opt.thp"), "always");
   EXPECT_EQ(StringOption("opt.metadata_thp"), "always");
+}
+
+TEST(HeapSettings, FreedMemoryIsKeptForThirtySeconds) {
+  if (std::getenv("MALLOC_CONF") != nullptr)
+    GTEST_SKIP() << "MALLOC_CONF overrides the built-in settings";
+  for (const char* name : {"opt.dirty_decay_ms", "opt.muzzy_decay_ms"}) {
+    ssize_t decay = 0;
+    size_t size = sizeof(decay);
+    ASSERT_EQ(mallctl(name, &decay, &size, nullptr, 0), 0) << name;
+    EXPECT_EQ(decay, 30000) << name;
+  }
 }
 
 TEST(HeapSettings, OperatorNewGoesThroughTheAllocator) {
