@@ -70,6 +70,21 @@ TEST_F(ZitBltRepTest, IconOffsetFollowsTheLocationKeywordSideBySide) {
   }
 }
 
+TEST_F(ZitBltRepTest, TheButtonManipulatorIsMadeByTheFirstPickAndDroppedByARebuild) {
+  QELZitBltRep* rep = Make("topmiddle");
+  VOR2DBagRep_var first = rep->GetZitBltBtn();
+  EXPECT_EQ(first->GetManipulator(), nullptr) << "an untouched button carries none";
+  VORManipulator* picked = first->PickManipulator();
+  ASSERT_NE(picked, nullptr);
+  EXPECT_EQ(picked, rep->GetManipulator());
+  EXPECT_EQ(first->GetManipulator(), picked) << "the manipulator acts on the button bag";
+  EXPECT_EQ(first->PickManipulator(), picked) << "made once";
+
+  rep->BuildRep(nullptr);
+  EXPECT_EQ(first->PickManipulator(), nullptr) << "the old bag no longer reaches the ZitBlt";
+  EXPECT_NE(rep->GetZitBltBtn()->PickManipulator(), nullptr);
+}
+
 TEST_F(ZitBltRepTest, TopAndBottomSlideAlongXAndEveryOtherKeywordAlongY) {
   for (const char* horizontal :
        {"topleft", "topmiddle", "topright", "bottomleft", "bottommiddle", "bottomright"}) {

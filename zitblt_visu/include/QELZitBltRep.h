@@ -71,7 +71,9 @@ class QELZitBltRep : public VORCommand {
   bool IsExpandedShown() const { return _expandedBag && _expandedBag->IsShown(); }
   // Sets both bags' matrix (the placement on the node).
   void SetBagsMatrix(const VOR3x3Matrix& matrix);
-  VOR2DManipulator* GetManipulator() const { return _manipulator; }
+  // The button's manipulator, made on first need (a pick, a script step): most buttons of a
+  // level are never touched. Null before BuildRep.
+  VOR2DManipulator* GetManipulator();
   bool IsButtonCollapse() const { return _collapsed != 0; }
   // True while the button shows its icon in grey.
   bool IsButtonGrey() const { return _grey; }

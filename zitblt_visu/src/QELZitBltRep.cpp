@@ -22,6 +22,21 @@ bool IsHorizontalEdge(const VORUnicodeString& location) {
   return false;
 }
 
+// The button bag: a pick on it asks the ZitBlt for its manipulator, which is made then.
+class ButtonBag : public VOR2DBagRep {
+ public:
+  explicit ButtonBag(QELZitBltRep* owner) : _owner(owner) {}
+  void ForgetOwner() { _owner = nullptr; }
+  VORManipulator* PickManipulator() override {
+    if (GetManipulator() == nullptr && _owner != nullptr)
+      return _owner->GetManipulator();
+    return GetManipulator();
+  }
+
+ private:
+  QELZitBltRep* _owner;  // clears this before it goes or makes another bag
+};
+
 // Decoded icons by file name: every button gets its own copy (it is converted in place), but
 // the search along the start-up path and the decoding happen once per icon. Failures are not
 // kept, so an icon added later is found.
@@ -138,6 +153,8 @@ QELZitBltRep::~QELZitBltRep() {
 }
 
 void QELZitBltRep::DeleteManipulator() {
+  if (_btnBag)
+    static_cast<ButtonBag*>(_btnBag.get())->ForgetOwner();
   if (_manipulator == nullptr)
     return;
   // The manipulator holds the button bag: let go of it so that neither keeps the other alive.
@@ -162,7 +179,8 @@ void QELZitBltRep::RemoveModels() {
 void QELZitBltRep::BuildRep(VORViewer* viewer) {
   // A second build replaces the first: its models leave the interactive set.
   RemoveModels();
-  _btnBag = VOR2DBagRep_var::Adopt(new VOR2DBagRep());
+  DeleteManipulator();
+  _btnBag = VOR2DBagRep_var::Adopt(new ButtonBag(this));
   _expandedBag = NULL_var;
   _expandedShowMode = 0;
   _viewer = viewer;
@@ -181,17 +199,19 @@ void QELZitBltRep::BuildRep(VORViewer* viewer) {
   SetZitbltButtonGrey(ButtonStartsGrey() ? 1 : 0);
   SetExpandedShowMode(_collapsed ? 1 : 0);
 
-  DeleteManipulator();
+  // The button slides along the edge it was built on.
+  const bool horizontal = IsHorizontalEdge(GetLocation());
+  _horizontalLimit = horizontal ? 1 : 0;
+  _verticalLimit = horizontal ? 0 : 1;
+}
+
+VOR2DManipulator* QELZitBltRep::GetManipulator() {
+  if (_manipulator != nullptr || !_btnBag)
+    return _manipulator;
   _manipulator = new VOR2DManipulator(this, "ActivManip", _btnBag, 1, 0);
-  if (IsHorizontalEdge(GetLocation())) {
-    _manipulator->SetDirection(VORMathVector2Df(1.0f, 0.0f));
-    _horizontalLimit = 1;
-    _verticalLimit = 0;
-  } else {
-    _manipulator->SetDirection(VORMathVector2Df(0.0f, 1.0f));
-    _verticalLimit = 1;
-    _horizontalLimit = 0;
-  }
+  _manipulator->SetDirection(_horizontalLimit ? VORMathVector2Df(1.0f, 0.0f)
+                                              : VORMathVector2Df(0.0f, 1.0f));
+  return _manipulator;
 }
 
 VOR2DBagRep* QELZitBltRep::GetZitBltExpanded() {

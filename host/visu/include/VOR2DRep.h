@@ -69,6 +69,9 @@ class VOR2DRep : public VORBaseUnknown {
   VOR2DBagRep* GetFather() const { return _father; }
   // The manipulator acting on this rep, or null (set by the manipulator).
   VORManipulator* GetManipulator() const { return _manipulator; }
+  // The manipulator a pick on this rep starts: the one set on it, or, for a rep whose owner
+  // makes it on first need, that one.
+  virtual VORManipulator* PickManipulator() { return _manipulator; }
 
   VORBox2D GetBoundingBox() const;
   // Boxes computed again (cache misses of GetBoundingBox) in this process: what a change costs,

@@ -309,10 +309,10 @@ VORManipulator* VORViewer::ManipulatorAt(double px, double py, VOR2DRep** elemen
   // The frontmost rep decides; its nearest manipulated ancestor owns the gesture.
   const std::vector<VOR2DRep*>& reps = hits.front().reps;
   for (auto it = reps.rbegin(); it != reps.rend(); ++it) {
-    if ((*it)->GetManipulator() != nullptr) {
+    if (VORManipulator* manipulator = (*it)->PickManipulator()) {
       if (element != nullptr)
         *element = *it;
-      return (*it)->GetManipulator();
+      return manipulator;
     }
   }
   return nullptr;
