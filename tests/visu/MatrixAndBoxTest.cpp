@@ -78,14 +78,6 @@ TEST(MatrixTest, TranslationsKeepFloatInputsExactAndComposeInDouble) {
   EXPECT_EQ(box.ymin, 0.1 + 0.2);
 }
 
-TEST(MatrixTest, QuarterTurnLeavesARoundingResidue) {
-  // Documented: rotations come from cos/sin and are not snapped.
-  const VORMathPoint2D p = VOR3x3Matrix::Rotation(std::numbers::pi / 2.0).Transform(1.0, 0.0);
-  EXPECT_NE(p.x, 0.0);
-  EXPECT_NEAR(p.x, 0.0, 1e-15);
-  EXPECT_EQ(p.y, 1.0);
-}
-
 using RepBoxTest = VisuTest;
 
 TEST_F(RepBoxTest, NestedBagsMapChildBoxesThroughEveryMatrixAndIgnoreHiddenChildren) {
