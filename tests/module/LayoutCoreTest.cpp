@@ -103,7 +103,7 @@ TEST(LayoutCoreTest, ChainAndIndependentNodesGetTheirLevelsAndSquare) {
   EXPECT_FLOAT_EQ(QELPFVLayoutCore::ChartSide(three.level), 150.0f);
 }
 
-TEST(LayoutCoreTest, UnequalBranchesThatMeetAgainAreReportedAsCyclicAtTheMeetingNode) {
+TEST(LayoutCoreTest, CyclesAndUnequalBranchesThatMeetAgainAreReportedAtTheNodeMetAgain) {
   // A->B->D and A->C->E->D (A=0, B=1, C=2, D=3, E=4).
   auto diamond = QELPFVLayoutCore::ComputeLevels(Graph({{1, 2}, {3}, {4}, {}, {3}}));
   EXPECT_TRUE(diamond.cyclic);
@@ -112,9 +112,7 @@ TEST(LayoutCoreTest, UnequalBranchesThatMeetAgainAreReportedAsCyclicAtTheMeeting
   auto even = QELPFVLayoutCore::ComputeLevels(Graph({{1, 2}, {3}, {3}, {}}));
   EXPECT_FALSE(even.cyclic);
   EXPECT_EQ(even.level, (std::vector<int>{0, 1, 1, 2}));
-}
-
-TEST(LayoutCoreTest, ATrueCycleNamesTheNodeMetAgain) {
+  // A true cycle names the node met again.
   auto cycle = QELPFVLayoutCore::ComputeLevels(Graph({{1}, {0}}));
   EXPECT_TRUE(cycle.cyclic);
   EXPECT_EQ(cycle.cyclicIndex, 0);
