@@ -252,6 +252,16 @@ TEST_F(ViewerTest, ClosingRestoresTheGraphEditorParametersAndTracesTheWindowsSte
   VORTrace::SetEnabledChannels("");
   EXPECT_EQ(QELPertParameters::PERT_GRID_CELL_SIZE, 25.0);
   EXPECT_EQ(QELPertParameters::PERT_LABEL_HEIGHT, 2.0);
+  auto has = [&](const std::string& line) {
+    return std::find(lines.begin(), lines.end(), line) != lines.end();
+  };
+  EXPECT_TRUE(has("QELFpaViewerCmdsTrace:  \n  QELFpaProductFlowViewerCmd::BuildGraph -->"));
+  EXPECT_TRUE(has("QELFpaViewerCmdsTrace: Created the PERT Adapter"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELFpaProductFlowViewer::Constructor <--"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELFpaProductFlowViewer::DeleteWindow <--"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELPFVNodeOrganiser::ArrangeNodes -->"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELPFVNodeOrganiser::GetViewerOrSuperNodeSize -->"));
+  EXPECT_TRUE(has("QELProductFlowViewerTrace: QELPFVNodeOrganiser::DispatchNotif -->"));
   EXPECT_EQ(std::count(lines.begin(), lines.end(),
                        "QELProductFlowViewerTrace: QELFpaProductFlowViewer::Destructor -->"),
             2);
