@@ -192,8 +192,8 @@ void QELZitBltRep::BuildRep(VORViewer* viewer) {
     // In the set at once, after the button, so that the bag made later is drawn where it would
     // have been; a model without a rep draws and picks nothing.
     _expandedModel = VORModelForRep2D_var::Adopt(new VORModelForRep2D());
-    iso->AddElement(_btnModel);
-    iso->AddElement(_expandedModel);
+    iso->AddElement(_btnModel.get());
+    iso->AddElement(_expandedModel.get());
   }
 
   SetZitbltButtonGrey(ButtonStartsGrey() ? 1 : 0);

@@ -11,13 +11,31 @@
 #include "VOREventPublisher.h"
 #include "VORLists.h"
 
+class VORISO;
+
+// A model that keeps its place in a set itself: adding and removing it looks nothing up in the
+// set's index, which on a chart of many nodes is a cache miss per model. It keeps the place of
+// one set only; another set that takes it files it in its index like any other model.
+class VORISOElement : public VORBaseUnknown {
+  VOR_DECLARE_CLASS(VORISOElement, VORBaseUnknown)
+ public:
+  VORISOElement() = default;
+
+ private:
+  friend class VORISO;
+  VORISO* _placedIn = nullptr;  // not held: the set clears it when it lets the model go
+  std::size_t _slot = 0;
+};
+
 class VORISO : public VORBaseUnknown {
   VOR_DECLARE_CLASS(VORISO, VORBaseUnknown)
  public:
   VORISO();
 
-  // Adds a model once; false when it is already there or null.
+  // Adds a model once; false when it is already there or null. A VORISOElement keeps its own
+  // place, whichever of the two is called.
   bool AddElement(VORBaseUnknown* model);
+  bool AddElement(VORISOElement* model);
   bool RemoveElement(VORBaseUnknown* model);
   // By identity, without a scan: a chart adds several models per node.
   bool IsPresent(VORBaseUnknown* model) const;
@@ -38,11 +56,20 @@ class VORISO : public VORBaseUnknown {
  private:
   // Adding and removing cost O(1) (a removed model leaves a null slot, dropped at the next
   // compaction), so that removing the ZitBlts of many nodes of a large chart stays linear.
+  struct Slot {
+    VORBaseUnknown_var model;  // null once removed
+    VORISOElement* placed;     // the model when it keeps its place itself, else null
+  };
+  bool Add(VORBaseUnknown* model, VORISOElement* placed);
+  // The slot of a listed model, or nullptr.
+  Slot* SlotOf(VORBaseUnknown* model);
   void Compact();
   void Invalidate();
 
-  std::vector<VORBaseUnknown_var> _slots;
-  // identity -> index in _slots; flat, so that adding a model allocates nothing of its own.
+  std::vector<Slot> _slots;
+  std::size_t _size = 0;  // listed models
+  // identity -> index in _slots of the models that do not keep their place; flat, so that
+  // adding a model allocates nothing of its own.
   absl::flat_hash_map<VORBaseUnknown*, std::size_t> _slotOf;
   mutable VORListValVORBaseUnknown_var _models;  // _slots without the holes
   mutable bool _modelsValid = true;

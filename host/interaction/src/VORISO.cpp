@@ -11,19 +11,37 @@ const std::string kRemoved = "VORISORemove";
 
 VORISO::VORISO() : _publisher(VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher(this))) {}
 
-VORISO::~VORISO() = default;
+VORISO::~VORISO() {
+  // A model may outlive the set: it must not keep a place in it.
+  for (Slot& slot : _slots) {
+    if (slot.placed != nullptr)
+      slot.placed->_placedIn = nullptr;
+  }
+}
+
+VORISO::Slot* VORISO::SlotOf(VORBaseUnknown* model) {
+  if (model == nullptr)
+    return nullptr;
+  VORBaseUnknown* identity = model->GetIdentity();
+  if (auto* placed = dynamic_cast<VORISOElement*>(identity); placed && placed->_placedIn == this)
+    return &_slots[placed->_slot];
+  if (_slotOf.empty())
+    return nullptr;
+  auto it = _slotOf.find(identity);
+  return it == _slotOf.end() ? nullptr : &_slots[it->second];
+}
 
 bool VORISO::IsPresent(VORBaseUnknown* model) const {
-  return model != nullptr && _slotOf.count(model->GetIdentity()) != 0;
+  return const_cast<VORISO*>(this)->SlotOf(model) != nullptr;
 }
 
 const VORListValVORBaseUnknown_var& VORISO::GetElements() const {
   if (!_modelsValid) {
     _models.RemoveAll();
-    _models.Reserve(static_cast<int>(_slotOf.size()));
-    for (const VORBaseUnknown_var& model : _slots) {
-      if (model)
-        _models.Append(model);
+    _models.Reserve(static_cast<int>(_size));
+    for (const Slot& slot : _slots) {
+      if (slot.model)
+        _models.Append(slot.model);
     }
     _modelsValid = true;
   }
@@ -39,11 +57,14 @@ void VORISO::Invalidate() {
 
 void VORISO::Compact() {
   std::size_t kept = 0;
-  for (VORBaseUnknown_var& model : _slots) {
-    if (!model)
+  for (Slot& slot : _slots) {
+    if (!slot.model)
       continue;
-    _slotOf[model->GetIdentity()] = kept;
-    _slots[kept++] = std::move(model);
+    if (slot.placed != nullptr)
+      slot.placed->_slot = kept;
+    else
+      _slotOf[slot.model->GetIdentity()] = kept;
+    _slots[kept++] = std::move(slot);
   }
   _slots.resize(kept);
 }
@@ -51,23 +72,47 @@ void VORISO::Compact() {
 bool VORISO::AddElement(VORBaseUnknown* model) {
   if (model == nullptr)
     return false;
-  // One look-up: a chart adds several models per node.
-  if (!_slotOf.try_emplace(model->GetIdentity(), _slots.size()).second)
+  return Add(model, dynamic_cast<VORISOElement*>(model->GetIdentity()));
+}
+
+bool VORISO::AddElement(VORISOElement* model) {
+  return model != nullptr && Add(model, model);
+}
+
+bool VORISO::Add(VORBaseUnknown* model, VORISOElement* placed) {
+  if (placed != nullptr && placed->_placedIn == this)
     return false;
-  _slots.emplace_back(model);
+  VORBaseUnknown* identity = model->GetIdentity();
+  // Filed in the index while another set keeps its place, and perhaps still filed from then.
+  if (!_slotOf.empty() && _slotOf.contains(identity))
+    return false;
+  if (placed != nullptr && placed->_placedIn == nullptr) {
+    placed->_placedIn = this;
+    placed->_slot = _slots.size();
+  } else {
+    placed = nullptr;
+    _slotOf.emplace(identity, _slots.size());
+  }
+  _slots.push_back(Slot{VORBaseUnknown_var(model), placed});
+  ++_size;
   Invalidate();
   _publisher->Dispatch(kAdded);
   return true;
 }
 
 bool VORISO::RemoveElement(VORBaseUnknown* model) {
-  auto it = model == nullptr ? _slotOf.end() : _slotOf.find(model->GetIdentity());
-  if (it == _slotOf.end())
+  Slot* slot = SlotOf(model);
+  if (slot == nullptr)
     return false;
   // Released after the bookkeeping: the model may be the last reference to its rep.
-  VORBaseUnknown_var removed = std::move(_slots[it->second]);
-  _slotOf.erase(it);
-  if (_slots.size() > 2 * _slotOf.size() + 16)
+  VORBaseUnknown_var removed = std::move(slot->model);
+  if (slot->placed != nullptr)
+    slot->placed->_placedIn = nullptr;
+  else
+    _slotOf.erase(removed->GetIdentity());
+  slot->placed = nullptr;
+  --_size;
+  if (_slots.size() > 2 * _size + 16)
     Compact();
   Invalidate();
   _publisher->Dispatch(kRemoved);
@@ -75,11 +120,16 @@ bool VORISO::RemoveElement(VORBaseUnknown* model) {
 }
 
 void VORISO::Empty() {
-  if (_slotOf.empty())
+  if (_size == 0)
     return;
-  std::vector<VORBaseUnknown_var> removed;
+  std::vector<Slot> removed;
   removed.swap(_slots);
+  for (Slot& slot : removed) {
+    if (slot.placed != nullptr)
+      slot.placed->_placedIn = nullptr;
+  }
   _slotOf.clear();
+  _size = 0;
   Invalidate();
   _publisher->Dispatch(kRemoved);
 }

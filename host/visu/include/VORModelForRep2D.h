@@ -3,9 +3,10 @@
 #pragma once
 
 #include "VOR2DRep.h"
+#include "VORISO.h"
 
-class VORModelForRep2D : public VORBaseUnknown {
-  VOR_DECLARE_CLASS(VORModelForRep2D, VORBaseUnknown)
+class VORModelForRep2D : public VORISOElement {
+  VOR_DECLARE_CLASS(VORModelForRep2D, VORISOElement)
  public:
   VORModelForRep2D() = default;
   // The rep is held by the model.
