@@ -275,4 +275,21 @@ TEST_F(ZitBltRepTest, BagsJoinTheCurrentEditorsInteractiveSetUntilTheRepGoes) {
   VORFrmEditor::SetCurrentEditor(nullptr);
 }
 
+TEST(ZitBltSharedTextTest, EqualTextsShareOneCopyWhateverCopyIsPassed) {
+  // Copies of one text, texts made anew, and texts that die and leave their place to others.
+  std::vector<VORUnicodeString> kept;
+  for (int round = 0; round < 3; ++round) {
+    for (int i = 0; i < 200; ++i) {
+      const VORUnicodeString fresh("location" + std::to_string(i % 70));
+      kept.push_back(fresh);
+      const VORUnicodeString& shared = QELSharedText(fresh);
+      EXPECT_EQ(shared, fresh);
+      EXPECT_EQ(&shared, &QELSharedText(kept[static_cast<size_t>(i % 70)]));
+      EXPECT_EQ(&shared, &QELSharedText(VORUnicodeString(fresh.ConvertToUTF8())));
+    }
+    kept.resize(70);
+  }
+  EXPECT_NE(&QELSharedText("ab"), &QELSharedText("abc"));
+}
+
 }  // namespace

@@ -2,6 +2,8 @@
 
 #include <unordered_map>
 
+#include <absl/container/flat_hash_map.h>
+
 #include "QELBaseListZitBltCmd.h"
 #include "QELIUpdateManufAssly.h"
 #include "QELIZitBltMgr.h"
@@ -22,8 +24,8 @@ bool callbacksSuspended = false;
 // cleared; the level's stand-in callback does that for all the subscribers it skipped.
 struct Level {
   VORCallbackId standIn = 0;
-  VORBaseUnknown* root = nullptr;                   // not held, as each subscriber's
-  std::unordered_map<const void*, int> activities;  // listening activity -> subscribers
+  VORBaseUnknown* root = nullptr;                    // not held, as each subscriber's
+  absl::flat_hash_map<const void*, int> activities;  // listening activity -> subscribers
 };
 std::unordered_map<const VOREventPublisher*, Level>& Levels() {
   static std::unordered_map<const VOREventPublisher*, Level> levels;

@@ -1,6 +1,8 @@
 #include "QELZitBltRep.h"
 
 #include <algorithm>
+#include <cstdint>
+#include <iterator>
 #include <map>
 #include <set>
 
@@ -79,7 +81,15 @@ bool QELIsKeyword(const VORUnicodeString& text, std::string_view keyword) {
 
 const VORUnicodeString& QELSharedText(const VORUnicodeString& text) {
   static std::set<VORUnicodeString> texts;
-  return *texts.insert(text).first;
+  // The configuration hands the same copies to every node: a copy is known by where its code
+  // points are, and then only compared with the kept text instead of searched in the set.
+  static const VORUnicodeString* recent[64] = {};
+  const std::u32string_view points = text.CodePoints();
+  const auto where = reinterpret_cast<std::uintptr_t>(points.data());
+  const VORUnicodeString*& slot = recent[(where >> 4) % std::size(recent)];
+  if (slot == nullptr || slot->CodePoints() != points)
+    slot = &*texts.insert(text).first;
+  return *slot;
 }
 
 VORPixelImage* QELZitBltRep::LoadIconImage(const VORUnicodeString& fileName) {

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include <absl/container/flat_hash_map.h>
+
 #include "VORHandle.h"
 
 namespace {
@@ -64,7 +66,8 @@ struct VOREventPublisher::Channel {
   std::string name;
   std::vector<EntryPtr> unkeyed;
   size_t unkeyedRemoved = 0;  // flagged removed, not yet erased
-  std::unordered_map<const void*, KeyedEntries<EntryPtr>> byKey;
+  // Flat: on a large level one key per activity, and a node per key would be a cache miss more.
+  absl::flat_hash_map<const void*, KeyedEntries<EntryPtr>> byKey;
 };
 
 namespace {
