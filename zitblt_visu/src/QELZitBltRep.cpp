@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstdint>
+#include <initializer_list>
 #include <iterator>
 #include <map>
 #include <set>
@@ -50,16 +51,17 @@ std::map<VORUnicodeString, VORPixelImage_var>& IconCache() {
 // The button images as drawn (converted to RGBA, opaque), in colour [0] and in grey [1], by
 // icon name (without ".bmp"). Nothing changes a button's image once it is drawn, so every button of
 // an icon shares them: a level of thousands of ZitBlts converts each icon twice, not once per
-// button.
-std::map<VORUnicodeString, VORPixelImage_var[2]>& ButtonImageCache() {
-  static std::map<VORUnicodeString, VORPixelImage_var[2]> cache;
+// button. Filed by the name's shared copy (QELSharedText), which lives as long as the process,
+// so that finding them compares no text.
+std::map<const VORUnicodeString*, VORPixelImage_var[2]>& ButtonImageCache() {
+  static std::map<const VORUnicodeString*, VORPixelImage_var[2]> cache;
   return cache;
 }
 
-VORPixelImage* ButtonImage(const VORUnicodeString& icon, bool grey) {
+VORPixelImage* ButtonImage(const VORUnicodeString* icon, bool grey) {
   VORPixelImage_var& slot = ButtonImageCache()[icon][grey ? 1 : 0];
   if (!slot) {
-    slot = VORPixelImage_var::Adopt(QELZitBltRep::LoadIconImage(icon + VORUnicodeString(".bmp")));
+    slot = VORPixelImage_var::Adopt(QELZitBltRep::LoadIconImage(*icon + VORUnicodeString(".bmp")));
     if (!slot)
       return nullptr;
     if (grey)
@@ -83,10 +85,10 @@ const VORUnicodeString& QELSharedText(const VORUnicodeString& text) {
   static std::set<VORUnicodeString> texts;
   // The configuration hands the same copies to every node: a copy is known by where its code
   // points are, and then only compared with the kept text instead of searched in the set.
-  static const VORUnicodeString* recent[64] = {};
+  static const VORUnicodeString* recent[256] = {};
   const std::u32string_view points = text.CodePoints();
   const auto where = reinterpret_cast<std::uintptr_t>(points.data());
-  const VORUnicodeString*& slot = recent[(where >> 4) % std::size(recent)];
+  const VORUnicodeString*& slot = recent[(where * 0x9E3779B97F4A7C15u) >> 56];
   if (slot == nullptr || slot->CodePoints() != points)
     slot = &*texts.insert(text).first;
   return *slot;
@@ -122,28 +124,31 @@ void QELZitBltIconOffset(const VORUnicodeString& location, float w, float h, flo
   // The halves are double products narrowed to float.
   const float hw = static_cast<float>(w * 0.5);
   const float hh = static_cast<float>(h * 0.5);
-  const std::string l = location.ConvertToUTF8();
+  auto is = [&location](std::initializer_list<const char*> keywords) {
+    return std::any_of(keywords.begin(), keywords.end(),
+                       [&location](const char* k) { return QELIsKeyword(location, k); });
+  };
   ox = 0.0f;
   oy = 0.0f;
-  if (l == "lefttop" || l == "leftbottom" || l == "bottomright") {
+  if (is({"lefttop", "leftbottom", "bottomright"})) {
     ox = -hw;
     oy = -hh;
-  } else if (l == "leftmiddle") {
+  } else if (is({"leftmiddle"})) {
     ox = -hw;
-  } else if (l == "righttop" || l == "rightbottom" || l == "bottomleft") {
+  } else if (is({"righttop", "rightbottom", "bottomleft"})) {
     ox = hw;
     oy = -hh;
-  } else if (l == "rightmiddle") {
+  } else if (is({"rightmiddle"})) {
     ox = hw;
-  } else if (l == "topleft") {
+  } else if (is({"topleft"})) {
     ox = hw;
     oy = hh;
-  } else if (l == "topmiddle") {
+  } else if (is({"topmiddle"})) {
     oy = hh;
-  } else if (l == "topright") {
+  } else if (is({"topright"})) {
     ox = -hw;
     oy = hh;
-  } else if (l == "bottommiddle") {
+  } else if (is({"bottommiddle"})) {
     oy = -hh;
   }
 }
@@ -254,7 +259,7 @@ void QELZitBltRep::SetBagsMatrix(const VOR3x3Matrix& matrix) {
 void QELZitBltRep::SetZitbltButtonGrey(unsigned char grey) {
   if (!_btnBag)
     return;
-  VORPixelImage_var image(ButtonImage(*_icon, grey == 1));
+  VORPixelImage_var image(ButtonImage(_icon, grey == 1));
   if (!image)
     return;
   for (int i = _btnBag->GetSize(); i >= 1; --i)
