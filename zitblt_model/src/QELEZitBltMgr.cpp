@@ -130,28 +130,30 @@ void QELEZitBltMgr::AnchorFor(const VORUnicodeString& location, double x, double
   const float hw = static_cast<float>(w / 2.0);
   const float hh = static_cast<float>(h / 2.0);
   const float button = 0.0f;
-  const std::string l = location.ConvertToUTF8();
+  auto is = [&location](const char* a, const char* b = nullptr) {
+    return QELIsKeyword(location, a) || (b != nullptr && QELIsKeyword(location, b));
+  };
   float dx = 0.0f;
   float dy = 0.0f;
-  if (l == "lefttop" || l == "topleft") {
+  if (is("lefttop", "topleft")) {
     dx = -hw + button / 2;
     dy = hh - button / 2;
-  } else if (l == "leftmiddle") {
+  } else if (is("leftmiddle")) {
     dx = -hw + button / 2;
-  } else if (l == "leftbottom" || l == "bottomleft") {
+  } else if (is("leftbottom", "bottomleft")) {
     dx = -hw + button / 2;
     dy = -hh + button / 2;
-  } else if (l == "righttop" || l == "topright") {
+  } else if (is("righttop", "topright")) {
     dx = hw - button / 2;
     dy = hh - button / 2;
-  } else if (l == "rightmiddle") {
+  } else if (is("rightmiddle")) {
     dx = hw - button / 2;
-  } else if (l == "rightbottom" || l == "bottomright") {
+  } else if (is("rightbottom", "bottomright")) {
     dx = hw - button / 2;
     dy = -hh + button / 2;
-  } else if (l == "topmiddle") {
+  } else if (is("topmiddle")) {
     dy = hh - button / 2;
-  } else if (l == "bottommiddle") {
+  } else if (is("bottommiddle")) {
     dy = -hh + button / 2;
   }
   ax = x + dx;
