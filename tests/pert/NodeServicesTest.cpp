@@ -117,6 +117,16 @@ TEST_F(NodeServicesTest, ExtensionsAndProvisionalPositionsForNodesNeverPlaced) {
   EXPECT_TRUE(created);
   QELFpaPertBaseServices::GetPertExtension(nc, created);
   EXPECT_FALSE(created);
+  // A node made where a deleted one was (as the heap likes to do) is new all the same.
+  for (int round = 0; round < 3; ++round) {
+    VORBaseUnknown_var d;
+    doc->GetDoor().CreateNode(root, "BIWActivityStation", d);
+    VORIGENode_var nd(d);
+    QELFpaPertBaseServices::GetPertExtension(nd, created);
+    EXPECT_TRUE(created) << "round " << round;
+    nd = nullptr;
+    doc->GetDoor().RemoveNode(d);
+  }
 
   EXPECT_EQ(QELFpaPertBaseServices::InitNodePosition(na), S_FALSE);
   EXPECT_EQ(QELFpaPertBaseServices::InitNodePosition(nc), S_OK);

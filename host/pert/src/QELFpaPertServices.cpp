@@ -8,18 +8,12 @@ QELIPertNodeExt_var QELFpaPertBaseServices::GetPertExtension(VORIGENode_var& nod
   created = false;
   if (!node)
     return QELIPertNodeExt_var();
-  // Extensions are made on first query: remember which nodes were asked before.
-  static std::unordered_map<VORBaseUnknown*, const void*> known;
   QELIPertNodeExt_var ext(node);
   if (!ext)
     return ext;
-  VORBaseUnknown* key = node.Identity();
-  auto it = known.find(key);
-  if (it == known.end() || it->second != ext.get()) {
-    // A new object at a recycled address has a new extension as well.
-    known[key] = ext.get();
-    created = true;
-  }
+  // The extension remembers being asked: a list of every node ever asked would only grow.
+  if (QELEPertNodeExt* data = QELEPertNodeExt::Of(node))
+    created = data->FirstAsked();
   return ext;
 }
 

@@ -2,6 +2,8 @@
 // rest of the graph editor, and their registration.
 #pragma once
 
+#include <utility>
+
 #include "QELIPertNodeExt.h"
 #include "VORIGraphNodeLayout.h"
 #include "VORExtension.h"
@@ -48,6 +50,9 @@ class QELEPertNodeExt : public VORExtension, public QELIPertNodeExt {
   // The extension of node (created on first use); null for objects that are no graph nodes.
   static QELEPertNodeExt* Of(VORBaseUnknown* node);
 
+  // True the first time only: whether a chart is the first to ask for this node.
+  bool FirstAsked() { return !std::exchange(_asked, true); }
+
  private:
   bool _hasPosition = false;
   double _x = 0.0;
@@ -59,6 +64,7 @@ class QELEPertNodeExt : public VORExtension, public QELIPertNodeExt {
   VORBaseUnknown* _reference = nullptr;
   double _drawnW = 0.0;
   double _drawnH = 0.0;
+  bool _asked = false;
 };
 
 // What QELIPertNode::SetPosition does with index 1, for callers that hold the node's extension
