@@ -4,6 +4,7 @@
 #pragma once
 
 #include <cstddef>
+#include <optional>
 #include <vector>
 
 #include <absl/container/flat_hash_map.h>
@@ -61,8 +62,8 @@ class VORISO : public VORBaseUnknown {
     VORISOElement* placed;     // the model when it keeps its place itself, else null
   };
   bool Add(VORBaseUnknown* model, VORISOElement* placed);
-  // The slot of a listed model, or nullptr.
-  Slot* SlotOf(VORBaseUnknown* model);
+  // Where a listed model is in _slots.
+  std::optional<std::size_t> IndexOf(VORBaseUnknown* model) const;
   void Compact();
   void Invalidate();
 

@@ -19,20 +19,20 @@ VORISO::~VORISO() {
   }
 }
 
-VORISO::Slot* VORISO::SlotOf(VORBaseUnknown* model) {
+std::optional<std::size_t> VORISO::IndexOf(VORBaseUnknown* model) const {
   if (model == nullptr)
-    return nullptr;
+    return std::nullopt;
   VORBaseUnknown* identity = model->GetIdentity();
   if (auto* placed = dynamic_cast<VORISOElement*>(identity); placed && placed->_placedIn == this)
-    return &_slots[placed->_slot];
+    return placed->_slot;
   if (_slotOf.empty())
-    return nullptr;
+    return std::nullopt;
   auto it = _slotOf.find(identity);
-  return it == _slotOf.end() ? nullptr : &_slots[it->second];
+  return it == _slotOf.end() ? std::nullopt : std::optional<std::size_t>(it->second);
 }
 
 bool VORISO::IsPresent(VORBaseUnknown* model) const {
-  return const_cast<VORISO*>(this)->SlotOf(model) != nullptr;
+  return IndexOf(model).has_value();
 }
 
 const VORListValVORBaseUnknown_var& VORISO::GetElements() const {
@@ -101,9 +101,10 @@ bool VORISO::Add(VORBaseUnknown* model, VORISOElement* placed) {
 }
 
 bool VORISO::RemoveElement(VORBaseUnknown* model) {
-  Slot* slot = SlotOf(model);
-  if (slot == nullptr)
+  const std::optional<std::size_t> index = IndexOf(model);
+  if (!index)
     return false;
+  Slot* slot = &_slots[*index];
   // Released after the bookkeeping: the model may be the last reference to its rep.
   VORBaseUnknown_var removed = std::move(slot->model);
   if (slot->placed != nullptr)
