@@ -72,7 +72,7 @@ function(pfv_test name)
   target_link_libraries(${name} PRIVATE pfv_warnings GTest::gtest GTest::gmock ${ARG_LIBS})
   pfv_use_product_heap(${name})
   set_target_properties(${name} PROPERTIES CROSSCOMPILING_EMULATOR
-    "${CMAKE_COMMAND};-E;env;VORStartupPath=${PFV_RESOURCE_DIR};VOR_MODULE_PATH=${PFV_MODULE_DIR};VOR_USER_SETTINGS_DIR=${CMAKE_BINARY_DIR}/test-settings/${name};PFV_TEST_DATA=${CMAKE_SOURCE_DIR}/tests/data;PFV_EXAMPLES=${CMAKE_SOURCE_DIR}/examples;QT_QPA_PLATFORM=offscreen;ASAN_OPTIONS=detect_leaks=1")
+    "${CMAKE_COMMAND};-E;env;VORStartupPath=${PFV_RESOURCE_DIR};VOR_MODULE_PATH=${PFV_MODULE_DIR};VOR_USER_SETTINGS_DIR=${CMAKE_BINARY_DIR}/test-settings/${name};PFV_TEST_DATA=${CMAKE_SOURCE_DIR}/tests/data;PFV_EXAMPLES=${CMAKE_SOURCE_DIR}/examples;QT_QPA_PLATFORM=offscreen;ASAN_OPTIONS=detect_leaks=1;LSAN_OPTIONS=suppressions=${CMAKE_SOURCE_DIR}/tests/qt-leaks.supp")
   # Cases are listed when ctest starts (not after linking), with a generous time-out: a
   # sanitizer build starts slowly on a busy machine.
   gtest_discover_tests(${name} TEST_PREFIX "${name}." DISCOVERY_MODE PRE_TEST
