@@ -17,12 +17,8 @@
 namespace {
 // The names whose refresh climbs to the parent activity's status bars.
 bool IsStatusBar(const VORUnicodeString& name) {
-  for (const char* bar : {"BIWStationStatusBars", "BIWPointFasteningStatusBars",
-                          "BIWCurveFasteningStatusBars", "BIWGroupingStatusBars"}) {
-    if (QELIsKeyword(name, bar))
-      return true;
-  }
-  return false;
+  return QELIsAnyKeyword(name, {"BIWStationStatusBars", "BIWPointFasteningStatusBars",
+                                "BIWCurveFasteningStatusBars", "BIWGroupingStatusBars"});
 }
 }  // namespace
 
@@ -130,30 +126,30 @@ void QELEZitBltMgr::AnchorFor(const VORUnicodeString& location, double x, double
   const float hw = static_cast<float>(w / 2.0);
   const float hh = static_cast<float>(h / 2.0);
   const float button = 0.0f;
-  auto is = [&location](const char* a, const char* b = nullptr) {
-    return QELIsKeyword(location, a) || (b != nullptr && QELIsKeyword(location, b));
+  auto is = [&location](std::initializer_list<std::string_view> keywords) {
+    return QELIsAnyKeyword(location, keywords);
   };
   float dx = 0.0f;
   float dy = 0.0f;
-  if (is("lefttop", "topleft")) {
+  if (is({"lefttop", "topleft"})) {
     dx = -hw + button / 2;
     dy = hh - button / 2;
-  } else if (is("leftmiddle")) {
+  } else if (is({"leftmiddle"})) {
     dx = -hw + button / 2;
-  } else if (is("leftbottom", "bottomleft")) {
+  } else if (is({"leftbottom", "bottomleft"})) {
     dx = -hw + button / 2;
     dy = -hh + button / 2;
-  } else if (is("righttop", "topright")) {
+  } else if (is({"righttop", "topright"})) {
     dx = hw - button / 2;
     dy = hh - button / 2;
-  } else if (is("rightmiddle")) {
+  } else if (is({"rightmiddle"})) {
     dx = hw - button / 2;
-  } else if (is("rightbottom", "bottomright")) {
+  } else if (is({"rightbottom", "bottomright"})) {
     dx = hw - button / 2;
     dy = -hh + button / 2;
-  } else if (is("topmiddle")) {
+  } else if (is({"topmiddle"})) {
     dy = hh - button / 2;
-  } else if (is("bottommiddle")) {
+  } else if (is({"bottommiddle"})) {
     dy = -hh + button / 2;
   }
   ax = x + dx;

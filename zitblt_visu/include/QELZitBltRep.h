@@ -5,6 +5,8 @@
 // the ZitBlt manager, which sets its strings, calls BuildRep and places it.
 #pragma once
 
+#include <initializer_list>
+
 #include <string_view>
 
 #include "VOR2DBagRep.h"
@@ -20,6 +22,9 @@ class QELBaseScrollListZitBltRep;
 
 // True when text is the ASCII keyword (a location or a ZitBlt name), without building a string.
 bool QELIsKeyword(const VORUnicodeString& text, std::string_view keyword);
+// True when text is one of the keywords.
+bool QELIsAnyKeyword(const VORUnicodeString& text,
+                     std::initializer_list<std::string_view> keywords);
 
 // The one kept copy of text. The strings of a ZitBlt (name, location, priority, state, icon)
 // come from the configuration and repeat on every node of a level: each rep points at a shared

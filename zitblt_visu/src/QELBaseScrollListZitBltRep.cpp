@@ -21,14 +21,6 @@
 #include "VORISPPActivity.h"
 
 namespace {
-bool IsOneOf(const VORUnicodeString& location, std::initializer_list<const char*> keywords) {
-  for (const char* k : keywords) {
-    if (QELIsKeyword(location, k))
-      return true;
-  }
-  return false;
-}
-
 VORCSO* CurrentCSO() {
   VORFrmEditor* editor = VORFrmEditor::GetCurrentEditor();
   return editor != nullptr ? editor->GetCSO() : nullptr;
@@ -51,13 +43,13 @@ constexpr int kCursorAfterDrag = 25;
 }  // namespace
 
 bool QELIsBottomGroupLocation(const VORUnicodeString& location) {
-  return IsOneOf(location, {"leftbottom", "bottomleft", "bottommiddle", "leftmiddle", "rightbottom",
-                            "bottomright"});
+  return QELIsAnyKeyword(location, {"leftbottom", "bottomleft", "bottommiddle", "leftmiddle",
+                                    "rightbottom", "bottomright"});
 }
 
 bool QELIsTopGroupLocation(const VORUnicodeString& location) {
-  return IsOneOf(location,
-                 {"lefttop", "topleft", "topmiddle", "topright", "righttop", "rightmiddle"});
+  return QELIsAnyKeyword(
+      location, {"lefttop", "topleft", "topmiddle", "topright", "righttop", "rightmiddle"});
 }
 
 int QELBaseScrollListZitBltRep::RangeFromEnvironment(int fallback) {
@@ -445,11 +437,11 @@ void QELBaseScrollListZitBltRep::AddScroller() {
   const VORUnicodeString& l = GetLocation();
   double x0 = 0.0, x1 = 0.0, y0 = 0.0, y1 = 0.0;  // outer and inner edge, start and end
   double sx0 = 0.0, sx1 = 0.0, sy = 0.0;          // the scroller
-  if (IsOneOf(l, {"bottommiddle", "bottomright", "bottomleft"})) {
+  if (QELIsAnyKeyword(l, {"bottommiddle", "bottomright", "bottomleft"})) {
     x0 = 0.0, x1 = 0.2, y0 = -5.0, y1 = -length - 5.0;
     sx0 = -0.75, sx1 = 0.95, sy = -(t + 5.0);
     _growsUp = 0;
-  } else if (IsOneOf(l, {"topmiddle", "topright", "topleft"})) {
+  } else if (QELIsAnyKeyword(l, {"topmiddle", "topright", "topleft"})) {
     x0 = 0.0, x1 = 0.2, y0 = 5.0, y1 = length + 5.0;
     sx0 = -0.75, sx1 = 0.95, sy = t + 5.0;
     _growsUp = 1;

@@ -2,8 +2,6 @@
 
 #include <algorithm>
 #include <cstdint>
-#include <initializer_list>
-#include <iterator>
 #include <map>
 #include <set>
 
@@ -17,12 +15,8 @@
 namespace {
 // Keywords that put the button on the top or bottom edge: it slides along x.
 bool IsHorizontalEdge(const VORUnicodeString& location) {
-  for (const char* keyword :
-       {"topleft", "topmiddle", "topright", "bottomleft", "bottommiddle", "bottomright"}) {
-    if (QELIsKeyword(location, keyword))
-      return true;
-  }
-  return false;
+  return QELIsAnyKeyword(
+      location, {"topleft", "topmiddle", "topright", "bottomleft", "bottommiddle", "bottomright"});
 }
 
 // The button bag: a pick on it asks the ZitBlt for its manipulator, which is made then.
@@ -81,6 +75,12 @@ bool QELIsKeyword(const VORUnicodeString& text, std::string_view keyword) {
                     [](char32_t a, char b) { return a == static_cast<unsigned char>(b); });
 }
 
+bool QELIsAnyKeyword(const VORUnicodeString& text,
+                     std::initializer_list<std::string_view> keywords) {
+  return std::any_of(keywords.begin(), keywords.end(),
+                     [&text](std::string_view k) { return QELIsKeyword(text, k); });
+}
+
 const VORUnicodeString& QELSharedText(const VORUnicodeString& text) {
   static std::set<VORUnicodeString> texts;
   // The configuration hands the same copies to every node: a copy is known by where its code
@@ -124,9 +124,8 @@ void QELZitBltIconOffset(const VORUnicodeString& location, float w, float h, flo
   // The halves are double products narrowed to float.
   const float hw = static_cast<float>(w * 0.5);
   const float hh = static_cast<float>(h * 0.5);
-  auto is = [&location](std::initializer_list<const char*> keywords) {
-    return std::any_of(keywords.begin(), keywords.end(),
-                       [&location](const char* k) { return QELIsKeyword(location, k); });
+  auto is = [&location](std::initializer_list<std::string_view> keywords) {
+    return QELIsAnyKeyword(location, keywords);
   };
   ox = 0.0f;
   oy = 0.0f;
