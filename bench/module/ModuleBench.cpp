@@ -2,8 +2,6 @@
 // viewer, and opening the viewer, on generated line-shaped levels. Run with VORStartupPath set
 // to resources/ and VOR_MODULE_PATH to the build's lib/ (the viewer command is loaded by name).
 #include <benchmark/benchmark.h>
-#include <dlfcn.h>
-#include <malloc.h>
 
 #include <algorithm>
 #include <cmath>
@@ -184,22 +182,9 @@ QELFpaProductFlowViewer* FindViewer() {
   return nullptr;
 }
 
-// What earlier runs freed goes back to the system before a run, so that every run starts from
-// the same heap: memory a process keeps idle is reclaimed by this virtual machine piece by
-// piece, and touching it again costs more with every run. The heap is jemalloc's when the
-// program runs on it (found at run time, so that no header is needed), else the C library's.
-void ReturnFreeMemoryToTheSystem() {
-  using MallCtl = int (*)(const char*, void*, std::size_t*, void*, std::size_t);
-  if (auto mallctl = reinterpret_cast<MallCtl>(dlsym(RTLD_DEFAULT, "mallctl")))
-    mallctl("arena.4096.purge", nullptr, nullptr, nullptr, 0);  // 4096: every arena
-  else
-    malloc_trim(0);
-}
-
 // The whole ArrangeNodes on an open viewer: positions written to the document, chart boxes and
 // links refreshed, one position notification per node.
 void BM_ArrangeNodesWithRefresh(benchmark::State& state) {
-  ReturnFreeMemoryToTheSystem();
   VORDriver driver;
   if (!OpenLine(driver, static_cast<int>(state.range(0)), false) ||
       !driver.StartCommand("QELFpaProductFlowViewerCmd") || FindViewer() == nullptr) {
@@ -231,7 +216,6 @@ void CloseViewerAndForgetPositions(VORDriver& driver, VORListValVORBaseUnknown_v
 // the machine's cost (large and erratic on a virtual machine), not the viewer's. Without it,
 // the first open is timed (run it with one iteration).
 void OpenViewerRepeatedly(benchmark::State& state, bool equipped, bool warm = true) {
-  ReturnFreeMemoryToTheSystem();
   VORDriver driver;
   if (!OpenLine(driver, static_cast<int>(state.range(0)), equipped)) {
     state.SkipWithError(("cannot open the level: " + driver.LastError()).c_str());
@@ -291,6 +275,8 @@ BENCHMARK(BM_PlainLongestPathLayering)
     ->Unit(benchmark::kMillisecond);
 // Opening and organising at 1,000, 10,000 and 100,000 stations. The machine is shared and its
 // speed wanders: each size runs kRuns times on a level of its own, and the median is the figure.
+// Every run starts from a heap without free memory: closing the previous run's document gave it
+// back to the system.
 constexpr int kRuns = 5;
 BENCHMARK(BM_ArrangeNodesWithRefresh)
     ->Arg(1000)

@@ -3,6 +3,7 @@
 #include <vector>
 
 #include "VORBaseUnknown.h"
+#include "VORHeap.h"
 
 namespace {
 std::vector<VORBaseUnknown*>& Queue() {
@@ -29,6 +30,7 @@ int Drain() {
       ++released;
     }
   }
+  VORHeap::DrainDone();
   return released;
 }
 

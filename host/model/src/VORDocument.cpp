@@ -3,6 +3,7 @@
 
 #include <algorithm>
 
+#include "VORHeap.h"
 #include "VORLateTypes.h"
 #include "VORModelDoorDetail.h"
 #include "VORModelObjects.h"
@@ -329,7 +330,11 @@ class VORPlanningHub : public virtual VORIIPDAdapter,
 
 VORProcess::VORProcess() : _data(std::make_unique<VORDocumentData>(this)) {}
 
-VORProcess::~VORProcess() = default;
+// A closed document's memory goes back to the system, with its chart's: the heap keeps freed
+// memory until then.
+VORProcess::~VORProcess() {
+  VORHeap::ReturnFreeMemoryAfterDrain();
+}
 
 VORProcess* VORProcess::CreateNew(const VORUnicodeString& rootLabel, const char* environment) {
   VORModelLateTypes::Declare();
