@@ -49,6 +49,9 @@ class VORBaseUnknown {
 
   // Number of component objects alive in the process; tests use it to find leaks.
   static long LiveInstances();
+  // Interface casts that were not among the recent answers; tests use it to see that repeated
+  // casts stay cheap.
+  static long CastAnswerLookups();
 
  protected:
   virtual ~VORBaseUnknown();

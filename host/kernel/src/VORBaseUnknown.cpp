@@ -31,18 +31,30 @@ struct CastKeyHash {
   }
 };
 
-// In front of the answers: the last answer per slot, found by the addresses of the type's
-// record and of the interface's name. Equal addresses mean an equal pair, so a hit needs no
-// name hashing or comparison (the answers compare names, as each library has its own records).
+// In front of the answers: recent answers found by the addresses of the type's record and of
+// the interface's name. Equal addresses mean an equal pair, so a hit needs no name hashing or
+// comparison (the answers compare names, as each library has its own records). Both addresses
+// are hashed: one library's interface names lie close together, and a type asked for several of
+// them in turn must not keep evicting its own answers. Each set holds two answers, the last
+// used first, so that two pairs that meet in one set still both stay.
 struct RecentCast {
   const std::type_info* type = nullptr;
   const char* iid = nullptr;
   std::size_t iidLength = 0;
   std::ptrdiff_t offset = 0;
+  bool Is(const std::type_info* t, const VORInterfaceId& id) const {
+    return type == t && iid == id.name.data() && iidLength == id.name.size();
+  }
 };
-constexpr std::size_t kRecentCasts = 1024;  // a power of two
+constexpr int kRecentSetBits = 9;
+struct RecentSet {
+  RecentCast ways[2];
+};
+
+long answerLookups = 0;
 
 std::ptrdiff_t AnswerOf(VORBaseUnknown* object, const VORInterfaceId& iid, const char* complete) {
+  ++answerLookups;
   // Never destroyed: casts may run while statics of other libraries are torn down.
   static auto* answers = new std::unordered_map<CastKey, std::ptrdiff_t, CastKeyHash>();
   const CastKey key{std::type_index(typeid(*object)), iid.name};
@@ -59,15 +71,25 @@ void* CachedCast(VORBaseUnknown* object, const VORInterfaceId& iid) {
   // The base interface answers the identity, which is no fixed offset for extensions.
   if (iid.name == VORBaseUnknown::IID().name)
     return iid.cast(object);
-  static RecentCast recent[kRecentCasts];
+  static RecentSet recent[std::size_t{1} << kRecentSetBits];
   auto* complete = static_cast<char*>(dynamic_cast<void*>(object));
   const std::type_info* type = &typeid(*object);
-  const auto mix = reinterpret_cast<std::uintptr_t>(type) * 0x9E3779B97F4A7C15u ^
-                   reinterpret_cast<std::uintptr_t>(iid.name.data());
-  RecentCast& slot = recent[(mix >> 17) & (kRecentCasts - 1)];
-  if (slot.type != type || slot.iid != iid.name.data() || slot.iidLength != iid.name.size())
-    slot = RecentCast{type, iid.name.data(), iid.name.size(), AnswerOf(object, iid, complete)};
-  return slot.offset == kNoInterface ? nullptr : complete + slot.offset;
+  const std::uintptr_t mix =
+      (reinterpret_cast<std::uintptr_t>(type) ^
+       reinterpret_cast<std::uintptr_t>(iid.name.data()) * 0x9E3779B97F4A7C15u) *
+      0xC2B2AE3D27D4EB4Fu;
+  RecentSet& set = recent[mix >> (64 - kRecentSetBits)];
+  if (!set.ways[0].Is(type, iid)) {
+    if (set.ways[1].Is(type, iid))
+      std::swap(set.ways[0], set.ways[1]);
+    else {
+      set.ways[1] = set.ways[0];
+      set.ways[0] =
+          RecentCast{type, iid.name.data(), iid.name.size(), AnswerOf(object, iid, complete)};
+    }
+  }
+  const std::ptrdiff_t offset = set.ways[0].offset;
+  return offset == kNoInterface ? nullptr : complete + offset;
 }
 }  // namespace
 
@@ -102,6 +124,10 @@ VORBaseUnknown::~VORBaseUnknown() {
 
 long VORBaseUnknown::LiveInstances() {
   return liveInstances;
+}
+
+long VORBaseUnknown::CastAnswerLookups() {
+  return answerLookups;
 }
 
 unsigned long VORBaseUnknown::AddRef() {
