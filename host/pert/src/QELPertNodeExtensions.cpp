@@ -89,11 +89,11 @@ class QELEPertNode : public VORExtension, public QELIPertNode {
   VOR_DECLARE_CLASS(QELEPertNode, VORExtension)
  public:
   HRESULT GetPosition(double& x, double& y, GE_POSITION_INDEX index) override {
-    QELEPertNodeExt* ext = QELEPertNodeExt::Of(GetExtendedObject());
+    QELEPertNodeExt* ext = Ext();
     return ext ? ext->GetPosition(x, y, index) : E_FAIL;
   }
   HRESULT SetPosition(double x, double y, GE_POSITION_INDEX index) override {
-    QELEPertNodeExt* ext = QELEPertNodeExt::Of(GetExtendedObject());
+    QELEPertNodeExt* ext = Ext();
     if (ext == nullptr)
       return E_FAIL;
     if (index != 1)
@@ -101,7 +101,7 @@ class QELEPertNode : public VORExtension, public QELIPertNode {
     return QELPertWritePosition(*ext, VORIGraphNodeLayout_var(GetExtendedObject()).get(), x, y);
   }
   HRESULT GetSize(double& width, double& height) override {
-    QELEPertNodeExt* ext = QELEPertNodeExt::Of(GetExtendedObject());
+    QELEPertNodeExt* ext = Ext();
     double w = 0.0;
     double h = 0.0;
     if (ext != nullptr)
@@ -126,6 +126,16 @@ class QELEPertNode : public VORExtension, public QELIPertNode {
     layout->SetPertNodeSize(width, height);
     return S_OK;
   }
+
+ private:
+  // The node's chart data, asked once: both are data extensions of the node and live as long as
+  // it does. A ZitBlt reads position and size on every move of its node.
+  QELEPertNodeExt* Ext() {
+    if (_ext == nullptr)
+      _ext = QELEPertNodeExt::Of(GetExtendedObject());
+    return _ext;
+  }
+  QELEPertNodeExt* _ext = nullptr;
 };
 
 class QELEPertPosition : public VORExtension, public QELIPertPosition {
