@@ -184,6 +184,16 @@ QELFpaProductFlowViewer* FindViewer() {
 
 // The whole ArrangeNodes on an open viewer: positions written to the document, chart boxes and
 // links refreshed, one position notification per node (each moving the node's ZitBlts).
+int Arrange(QELFpaProductFlowViewer& viewer) {
+  auto* organiser = new QELPFVNodeOrganiser();
+  const int done = organiser->ArrangeNodes(viewer.GetRootNode(), viewer.GetPertController());
+  organiser->RequestDelayedDestruction();
+  VORDeferredDeletion::Drain();
+  return done;
+}
+
+// One untimed arrangement comes first, as one untimed opening does for the openings: the
+// organiser's tables are then timed in memory the heap already holds.
 void ArrangeRepeatedly(benchmark::State& state, bool equipped) {
   VORDriver driver;
   if (!OpenLine(driver, static_cast<int>(state.range(0)), equipped) ||
@@ -192,13 +202,9 @@ void ArrangeRepeatedly(benchmark::State& state, bool equipped) {
     return;
   }
   QELFpaProductFlowViewer* viewer = FindViewer();
-  for (auto _ : state) {
-    auto* organiser = new QELPFVNodeOrganiser();
-    benchmark::DoNotOptimize(
-        organiser->ArrangeNodes(viewer->GetRootNode(), viewer->GetPertController()));
-    organiser->RequestDelayedDestruction();
-    VORDeferredDeletion::Drain();
-  }
+  Arrange(*viewer);
+  for (auto _ : state)
+    benchmark::DoNotOptimize(Arrange(*viewer));
   state.SetItemsProcessed(state.iterations() * state.range(0));
 }
 
