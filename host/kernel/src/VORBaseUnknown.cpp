@@ -7,7 +7,6 @@
 #include <typeindex>
 #include <unordered_map>
 #include <utility>
-#include <vector>
 
 #include <absl/container/inlined_vector.h>
 
