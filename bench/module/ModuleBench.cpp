@@ -292,63 +292,33 @@ BENCHMARK(BM_PlainLongestPathLayering)
 // speed wanders: each size runs kRuns times on a level of its own, and the median is the figure.
 // Every run starts from a heap without free memory: closing the previous run's document gave it
 // back to the system.
+namespace {
+
 constexpr int kRuns = 5;
-BENCHMARK(BM_ArrangeNodesWithRefresh)
-    ->Arg(1000)
-    ->Arg(10000)
-    ->Unit(benchmark::kMillisecond)
-    ->Iterations(10)
-    ->Repetitions(kRuns)
-    ->DisplayAggregatesOnly(true);
-BENCHMARK(BM_ArrangeNodesWithRefresh)
-    ->Arg(100000)
-    ->Unit(benchmark::kMillisecond)
-    ->Iterations(1)
-    ->Repetitions(kRuns)
-    ->DisplayAggregatesOnly(true);
-BENCHMARK(BM_ArrangeNodesWithLists)
-    ->Arg(1000)
-    ->Arg(10000)
-    ->Unit(benchmark::kMillisecond)
-    ->Iterations(10)
-    ->Repetitions(kRuns)
-    ->DisplayAggregatesOnly(true);
-BENCHMARK(BM_ArrangeNodesWithLists)
-    ->Arg(100000)
-    ->Unit(benchmark::kMillisecond)
-    ->Iterations(1)
-    ->Repetitions(kRuns)
-    ->DisplayAggregatesOnly(true);
-BENCHMARK(BM_OpenViewer)
-    ->Arg(1000)
-    ->Arg(10000)
-    ->Unit(benchmark::kMillisecond)
-    ->Iterations(5)
-    ->Repetitions(kRuns)
-    ->DisplayAggregatesOnly(true);
-BENCHMARK(BM_OpenViewer)
-    ->Arg(100000)
-    ->Unit(benchmark::kMillisecond)
-    ->Iterations(1)
-    ->Repetitions(kRuns)
-    ->DisplayAggregatesOnly(true);
-BENCHMARK(BM_OpenViewerWithLists)
-    ->Arg(1000)
-    ->Arg(10000)
-    ->Unit(benchmark::kMillisecond)
-    ->Iterations(5)
-    ->Repetitions(kRuns)
-    ->DisplayAggregatesOnly(true);
-BENCHMARK(BM_OpenViewerWithLists)
-    ->Arg(100000)
-    ->Unit(benchmark::kMillisecond)
-    ->Iterations(1)
-    ->Repetitions(kRuns)
-    ->DisplayAggregatesOnly(true);
-BENCHMARK(BM_FirstOpenViewerWithLists)
-    ->Arg(10000)
-    ->Arg(100000)
-    ->Unit(benchmark::kMillisecond)
-    ->Iterations(1)
-    ->Repetitions(kRuns)
-    ->DisplayAggregatesOnly(true);
+
+benchmark::internal::Benchmark* Runs(benchmark::internal::Benchmark* b, int iterations) {
+  return b->Unit(benchmark::kMillisecond)
+      ->Iterations(iterations)
+      ->Repetitions(kRuns)
+      ->DisplayAggregatesOnly(true);
+}
+
+// The two smaller sizes with several iterations per run, 100,000 stations with one.
+void RegisterBySize(const char* name, void (*run)(benchmark::State&), int iterations) {
+  Runs(benchmark::RegisterBenchmark(name, run)->Arg(1000)->Arg(10000), iterations);
+  Runs(benchmark::RegisterBenchmark(name, run)->Arg(100000), 1);
+}
+
+const bool registeredBySize = [] {
+  RegisterBySize("BM_ArrangeNodesWithRefresh", BM_ArrangeNodesWithRefresh, 10);
+  RegisterBySize("BM_ArrangeNodesWithLists", BM_ArrangeNodesWithLists, 10);
+  RegisterBySize("BM_OpenViewer", BM_OpenViewer, 5);
+  RegisterBySize("BM_OpenViewerWithLists", BM_OpenViewerWithLists, 5);
+  Runs(benchmark::RegisterBenchmark("BM_FirstOpenViewerWithLists", BM_FirstOpenViewerWithLists)
+           ->Arg(10000)
+           ->Arg(100000),
+       1);
+  return true;
+}();
+
+}  // namespace
