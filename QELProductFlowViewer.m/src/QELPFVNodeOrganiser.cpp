@@ -132,11 +132,15 @@ void QELPFVNodeOrganiser::ArrangeActAsPerLevel() {
   // the organiser's results are the same, in linear time (the exchange sort's own order costs up
   // to n x levels swaps on lines stored lane by lane).
   _order = QELPFVLayoutCore::StableLevelOrder(level);
+  // The handles move rather than being copied: a copy touches each object's reference count,
+  // a cache miss per node once the level outgrows the cache.
   VORListValVORBaseUnknown_var sorted;
   sorted.Reserve(n);
+  for (int p = 0; p < n; ++p)
+    sorted.Append(VORBaseUnknown_var());
   for (int p = 0; p < n; ++p) {
     const int from = _order[static_cast<size_t>(p)];
-    sorted.Append((*_childNodeList)[from + 1]);
+    sorted[p + 1] = std::move((*_childNodeList)[from + 1]);
     (*_levelList)[p + 1] = level[static_cast<size_t>(from)];
   }
   std::swap(*_childNodeList, sorted);
@@ -155,8 +159,13 @@ void QELPFVNodeOrganiser::CreateListOfLists() {
     while (end <= n && (*_levelList)[end] == v)
       ++end;
     list->Reserve(end - p);
-    while (p < end)
-      list->Append((*_childNodeList)[p++]);
+    // Only the first level keeps this order: ArrangeNextActsWithRespectToCurrActs fills every
+    // later list in its own order, so copying their handles here would only be undone.
+    if (v == 0) {
+      while (p < end)
+        list->Append((*_childNodeList)[p++]);
+    }
+    p = end;
     _levelLists->Append(list);
   }
 }
