@@ -90,9 +90,9 @@ void QELPertController::SetWindowRootNode(VORBaseUnknown* root, VORBaseUnknown_v
 }
 
 QELPertController::Node* QELPertController::Find(VORBaseUnknown* node) const {
-  auto it = _nodes.find(Key(node));
+  auto it = _nodeIndex.find(Key(node));
   // As with the owning pointers the map held before: finding a node does not freeze it.
-  return it == _nodes.end() ? nullptr : const_cast<Node*>(&it->second);
+  return it == _nodeIndex.end() ? nullptr : &*it->second;
 }
 
 bool QELPertController::IsInChart(VORBaseUnknown* node) const {
@@ -106,7 +106,7 @@ VOR2DBagRep* QELPertController::GetNodeRep(VORBaseUnknown* node) const {
 
 int QELPertController::GetLinkCount() const {
   size_t ends = 0;
-  for (const auto& [key, node] : _nodes)
+  for (const Node& node : _nodes)
     ends += node.links.size();
   return static_cast<int>(ends / 2);
 }
@@ -141,7 +141,10 @@ HRESULT QELPertController::AddChildNode(VORBaseUnknown_var& node) {
 }
 
 QELPertController::Node* QELPertController::AddNode(VORBaseUnknown* object, Level* level) {
-  Node* node = &_nodes.try_emplace(Key(object)).first->second;
+  auto [entry, added] = _nodeIndex.try_emplace(Key(object));
+  if (added)
+    entry->second = _nodes.emplace(_nodes.end());
+  Node* node = &*entry->second;
   node->object = Key(object);
   node->level = level;
   node->graph = VORIGENode_var(node->object);
@@ -433,7 +436,10 @@ void QELPertController::RemoveNode(Node* node, bool announce) {
     ext->SetDrawnSize(0.0, 0.0);
     ext->SetHiddenFlag(announce);
   }
-  _nodes.erase(Key(object));
+  if (auto it = _nodeIndex.find(Key(object)); it != _nodeIndex.end()) {
+    _nodes.erase(it->second);
+    _nodeIndex.erase(it);
+  }
   if (announce)
     Announce(object, 1);
 }
@@ -484,7 +490,7 @@ HRESULT QELPertController::RemoveChildNode(VORBaseUnknown_var& object) {
 }
 
 void QELPertController::ClearChart() {
-  for (auto& [key, node] : _nodes) {
+  for (Node& node : _nodes) {
     UnfollowModel(&node);
     if (QELEPertNodeExt* ext = node.ext) {
       ext->SetReference(nullptr);
@@ -495,6 +501,7 @@ void QELPertController::ClearChart() {
   if (_manipulator)
     _manipulator->RemoveAllElements();
   _dueLinks.clear();
+  _nodeIndex.clear();
   _nodes.clear();
   _top->members.clear();
   _top->linkList.clear();

@@ -131,7 +131,7 @@ void QELPertController::EndMoves() {
 
 void QELPertController::RefreshLinks() {
   std::vector<Level*> levels{_top.get()};
-  for (auto& [key, node] : _nodes) {
+  for (Node& node : _nodes) {
     node.links.clear();
     if (node.inner)
       levels.push_back(node.inner.get());
@@ -141,6 +141,6 @@ void QELPertController::RefreshLinks() {
     level->linkList.clear();
     level->links->EmptyBag();
   }
-  for (auto& [key, node] : _nodes)
+  for (Node& node : _nodes)
     AddLinksOf(&node);
 }
