@@ -181,14 +181,18 @@ void QELPFVNodeOrganiser::ArrangeNextActsWithRespectToCurrActs() {
   const std::vector<std::vector<int>> lists =
       QELPFVLayoutCore::LevelLists(_successors, level, _order);
   // Handles by original index: the sorted child list holds child order[p] at p + 1.
-  std::vector<const VORBaseUnknown_var*> byIndex(_order.size());
+  std::vector<VORBaseUnknown_var*> byIndex(_order.size());
   for (size_t p = 0; p < _order.size(); ++p)
     byIndex[static_cast<size_t>(_order[p])] = &(*_childNodeList)[static_cast<int>(p) + 1];
+  // The later levels take their handles over from the child list: a copy would touch each
+  // object's reference count, a cache miss per node on a large level. Each node is listed once.
   for (int k = 2; k <= _levelLists->Size(); ++k) {
     VORListValVORBaseUnknown_var* list = (*_levelLists)[k];
     list->RemoveAll();
-    for (int node : lists[static_cast<size_t>(k - 1)])
-      list->Append(*byIndex[static_cast<size_t>(node)]);
+    for (int node : lists[static_cast<size_t>(k - 1)]) {
+      list->Append(VORBaseUnknown_var());
+      (*list)[list->Size()] = std::move(*byIndex[static_cast<size_t>(node)]);
+    }
   }
 }
 
@@ -376,11 +380,14 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
   if (newNodes->Size() == 0)
     return true;
 
+  // The level list (1-based) of each node: the level lists hold every child once.
   const int n = _childNodeList->Size();
-  absl::flat_hash_map<VORBaseUnknown*, int> sortedIndex;
-  sortedIndex.reserve(static_cast<size_t>(n));
-  for (int p = 1; p <= n; ++p)
-    sortedIndex.emplace((*_childNodeList)[p].Identity(), p);
+  absl::flat_hash_map<VORBaseUnknown*, int> listOf;
+  listOf.reserve(static_cast<size_t>(n));
+  for (int k = 1; k <= _levelLists->Size(); ++k) {
+    for (const VORBaseUnknown_var& node : *(*_levelLists)[k])
+      listOf.emplace(node.Identity(), k);
+  }
   // The chart area depends on the levels only, which no move changes.
   float width = 300.0f;
   float height = 200.0f;
@@ -407,10 +414,10 @@ bool QELPFVNodeOrganiser::PositionNewNode(VORBaseUnknown_var root,
     }
     double x = 0.0;
     double y = 0.0;
-    auto found = newNode ? sortedIndex.find(newNode.Identity()) : sortedIndex.end();
-    if (found != sortedIndex.end()) {
+    auto found = newNode ? listOf.find(newNode.Identity()) : listOf.end();
+    if (found != listOf.end()) {
       const MoveBatch batch(_controller);
-      const int k0 = (*_levelList)[found->second] + 1;
+      const int k0 = found->second;
       if (k0 > 1) {
         VORListValVORBaseUnknown_var* previous = (*_levelLists)[k0 - 1];
         if (previous->Size() > 0) {

@@ -65,6 +65,8 @@ class QELPFVNodeOrganiser : public VORCommand {
   void NotifyMove(VORBaseUnknown_var& node, const VORBaseUnknown_var& reference, double x,
                   double y);
 
+  // The children, sorted by level once laid out; the handles of the later levels then live in
+  // their level lists only.
   VORListValVORBaseUnknown_var* _childNodeList = nullptr;
   VORRawCollint* _levelList;
   VORRawCollint* _visitedList;

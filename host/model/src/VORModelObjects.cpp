@@ -2,6 +2,7 @@
 #include "VORModelObjects.h"
 
 #include <algorithm>
+#include <string_view>
 #include <unordered_map>
 
 #include "VORLateTypes.h"
@@ -14,7 +15,8 @@ VORListValVORBaseUnknown_var* VORNewList() {
 bool VORMatchesFilter(VORModelObject* object, const char* filter) {
   if (filter == nullptr || *filter == '\0')
     return true;
-  const std::string f = filter;
+  // A view, not a string: flows are filtered once per visited neighbour.
+  const std::string_view f = filter;
   if (f == VORModelFilters::Activity)
     return VORKindCast<VORActivityImpl>(object) != nullptr;
   if (f == VORModelFilters::Item)
@@ -25,7 +27,7 @@ bool VORMatchesFilter(VORModelObject* object, const char* filter) {
   }
   if (f == VORModelFilters::Product)
     return VORKindCast<VORProductImpl>(object) != nullptr;
-  return VORLateTypes::IsKindOf(object->lateType, f);
+  return VORLateTypes::IsKindOf(object->lateType, std::string(f));
 }
 
 namespace {
