@@ -102,7 +102,11 @@ void QELPFVNodeOrganiser::GenerateNodeIndexes() {
       continue;
     std::vector<int>& succ = _successors[static_cast<size_t>(i - 1)];
     flows->ForEachNextActivity([&](VORBaseUnknown* s) {
-      auto it = index.find(s->GetIdentity());
+      // A successor is usually handed over as its identity; asking for the identity touches
+      // the successor, a cache miss on a large level. Live objects do not share addresses.
+      auto it = index.find(s);
+      if (it == index.end())
+        it = index.find(s->GetIdentity());
       if (it != index.end())
         succ.push_back(it->second);
     });

@@ -90,7 +90,12 @@ void QELPertController::SetWindowRootNode(VORBaseUnknown* root, VORBaseUnknown_v
 }
 
 QELPertController::Node* QELPertController::Find(VORBaseUnknown* node) const {
-  auto it = _nodeIndex.find(Key(node));
+  // Most callers hold the identity itself: a pointer that is a key is that object's identity
+  // (live objects do not share addresses), and asking for the identity first would touch the
+  // object, a cache miss per node on a large level.
+  auto it = _nodeIndex.find(node);
+  if (it == _nodeIndex.end())
+    it = _nodeIndex.find(Key(node));
   // As with the owning pointers the map held before: finding a node does not freeze it.
   return it == _nodeIndex.end() ? nullptr : &*it->second;
 }
