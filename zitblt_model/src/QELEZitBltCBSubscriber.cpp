@@ -10,6 +10,7 @@
 #include "QELZitBltCommandFactory.h"
 #include "QELZitBltConfiguration.h"
 #include "VORDeferredDeletion.h"
+#include "VORDynamicCast.h"
 #include "VORISPPActivity.h"
 #include "VORISPPActivityModificationEvents.h"
 #include "VORISpecObject.h"
@@ -34,7 +35,7 @@ std::unordered_map<const VOREventPublisher*, Level>& Levels() {
 
 void StandForSkippedSubscribers(const VOREventPublisher* publisher, VORNotification* n) {
   auto level = Levels().find(publisher);
-  auto* change = dynamic_cast<VORSPPActivityNotification*>(n);
+  auto* change = VORDynamicCast<VORSPPActivityNotification>(n);
   if (level == Levels().end() || change == nullptr || change->GetFather() == nullptr)
     return;
   QELIUpdateManufAssly_var update{VORBaseUnknown_var(level->second.root)};
@@ -133,7 +134,7 @@ void QELEZitBltCBSubscriber::CreateUpdateCommands() {
     if (!d.hasUpdateData)
       continue;
     VORCommand* created = QELZitBltCommandFactory::CreateUpdateCommand(d, activity);
-    auto* command = dynamic_cast<QELBaseListZitBltCmd*>(created);
+    auto* command = VORDynamicCast<QELBaseListZitBltCmd>(created);
     if (command == nullptr) {
       VORCommandDeletion(created);
       continue;
@@ -205,7 +206,7 @@ void QELEZitBltCBSubscriber::OnViewsChange(const std::string& event, VORNotifica
     cleared = true;
   }
   if (!callbacksSuspended) {
-    auto* activityNotification = dynamic_cast<VORSPPActivityNotification*>(notification);
+    auto* activityNotification = VORDynamicCast<VORSPPActivityNotification>(notification);
     if (activityNotification != nullptr && activityNotification->GetFather() != nullptr) {
       if (activityNotification->GetFather()->GetIdentity() != GetExtendedObject()->GetIdentity())
         return;  // another activity's change: the flag is deliberately not restored here

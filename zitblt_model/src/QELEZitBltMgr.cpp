@@ -8,6 +8,7 @@
 #include "QELZitBltConfiguration.h"
 #include "QELZitBltRep.h"
 #include "VORDeferredDeletion.h"
+#include "VORDynamicCast.h"
 #include "VORIModelEvents.h"
 #include "VORISPPActivity.h"
 #include "VORISpecObject.h"
@@ -69,7 +70,7 @@ void QELEZitBltMgr::BuildZitBlts() {
   _zitBlts.reserve(definitions.size());
   for (const QELZitBltDefinition& d : definitions) {
     VORCommand* created = QELZitBltCommandFactory::CreateRep(d, activity);
-    auto* rep = dynamic_cast<QELZitBltRep*>(created);
+    auto* rep = VORDynamicCast<QELZitBltRep>(created);
     if (rep == nullptr) {
       VORCommandDeletion(created);  // not a ZitBlt (or nothing): skipped
       continue;
@@ -257,7 +258,7 @@ void QELEZitBltMgr::FollowRecordedStatuses() {
   _recordedCallback = _activityPublisher->AddCallback(
       VORModify::ClassName(),
       [this](VORBaseUnknown*, const std::string&, VORNotification* n, void*, VORCallbackId) {
-        auto* modify = dynamic_cast<VORModify*>(n);
+        auto* modify = VORDynamicCast<VORModify>(n);
         if (_recording || modify == nullptr || modify->GetWhat() != "zitblt")
           return;
         ApplyRecordedStatuses(true);

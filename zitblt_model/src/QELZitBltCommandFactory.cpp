@@ -1,6 +1,7 @@
 #include "QELZitBltCommandFactory.h"
 
 #include "VORCommandHeader.h"
+#include "VORDynamicCast.h"
 #include "VORModuleLoader.h"
 
 namespace {
@@ -28,7 +29,7 @@ VORCommand* Create(VORCommandFactory& factory, const VORUnicodeString& id,
   VORBaseUnknown* object = factory(activity);
   if (object == nullptr)
     return nullptr;
-  auto* command = dynamic_cast<VORCommand*>(object);
+  auto* command = VORDynamicCast<VORCommand>(object);
   if (command == nullptr)
     object->Release();
   return command;

@@ -9,6 +9,7 @@
 #include <unordered_map>
 #include <vector>
 
+#include "VORDynamicCast.h"
 #include "VORModel.h"
 
 struct VORDocumentData;
@@ -495,7 +496,7 @@ template <class T>
 T* VORImplOf(VORBaseUnknown* object, VORDocumentData* data = nullptr) {
   if (object == nullptr)
     return nullptr;
-  T* impl = dynamic_cast<T*>(object->GetIdentity());
+  T* impl = VORDynamicCast<T>(object->GetIdentity());
   if (impl == nullptr || impl->data == nullptr)
     return nullptr;
   if (data != nullptr && impl->data != data)

@@ -2,6 +2,7 @@
 #include <algorithm>
 #include <unordered_map>
 
+#include "VORDynamicCast.h"
 #include "VORLateTypes.h"
 #include "VORModelObjects.h"
 #include "VORSmallSet.h"
@@ -13,7 +14,7 @@ VORBaseUnknown* Unk(VORModelObject* o) {
 }  // namespace
 
 VORActivityImpl* VORBIWItemInfoImpl::Self() {
-  return dynamic_cast<VORActivityImpl*>(this);
+  return VORDynamicCast<VORActivityImpl>(this);
 }
 
 namespace {

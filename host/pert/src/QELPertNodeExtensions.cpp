@@ -3,6 +3,7 @@
 #include "QELIPertNode.h"
 #include "QELIPertPosition.h"
 #include "QELPertNodeExtensions.h"
+#include "VORDynamicCast.h"
 #include "VORExtensionRegistry.h"
 #include "VORIGENode.h"
 #include "VORIGraphNodeLayout.h"
@@ -80,7 +81,7 @@ QELEPertNodeExt* QELEPertNodeExt::Of(VORBaseUnknown* node) {
     return nullptr;
   QELIPertNodeExt_var ext(node);
   // A data extension lives as long as its object: the raw pointer stays valid after the handle.
-  return dynamic_cast<QELEPertNodeExt*>(ext.get());
+  return VORDynamicCast<QELEPertNodeExt>(ext.get());
 }
 
 namespace {
