@@ -140,11 +140,9 @@ void QELPFVNodeOrganiser::ArrangeActAsPerLevel() {
   // a cache miss per node once the level outgrows the cache.
   VORListValVORBaseUnknown_var sorted;
   sorted.Reserve(n);
-  for (int p = 0; p < n; ++p)
-    sorted.Append(VORBaseUnknown_var());
   for (int p = 0; p < n; ++p) {
     const int from = _order[static_cast<size_t>(p)];
-    sorted[p + 1] = std::move((*_childNodeList)[from + 1]);
+    sorted.Append(std::move((*_childNodeList)[from + 1]));
     (*_levelList)[p + 1] = level[static_cast<size_t>(from)];
   }
   std::swap(*_childNodeList, sorted);
@@ -193,10 +191,8 @@ void QELPFVNodeOrganiser::ArrangeNextActsWithRespectToCurrActs() {
   for (int k = 2; k <= _levelLists->Size(); ++k) {
     VORListValVORBaseUnknown_var* list = (*_levelLists)[k];
     list->RemoveAll();
-    for (int node : lists[static_cast<size_t>(k - 1)]) {
-      list->Append(VORBaseUnknown_var());
-      (*list)[list->Size()] = std::move(*byIndex[static_cast<size_t>(node)]);
-    }
+    for (int node : lists[static_cast<size_t>(k - 1)])
+      list->Append(std::move(*byIndex[static_cast<size_t>(node)]));
   }
 }
 

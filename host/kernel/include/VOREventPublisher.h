@@ -68,9 +68,14 @@ class VOREventPublisher : public VORBaseUnknown {
   // A publisher has few names (a manipulator four, a model object a handful): they are searched
   // in order, and indexed by name only once there are many.
   std::vector<std::unique_ptr<Channel>> _channels;
-  // Their names side by side (views of each channel's own): a search reads one block instead
-  // of every channel of a publisher nobody touched lately.
-  std::vector<std::string_view> _channelNames;
+  // Their names side by side (views of each channel's own) with their hashes: a search reads
+  // one block and touches a channel's own name only when the hash agrees, instead of reading
+  // every channel of a publisher nobody touched lately.
+  struct ChannelName {
+    size_t hash;
+    std::string_view name;
+  };
+  std::vector<ChannelName> _channelNames;
   std::unordered_map<std::string_view, Channel*> _channelIndex;
   // Every callback by id (ids only grow, so appending keeps the order); a removed one stays,
   // flagged, until half of them are removed and no dispatch runs.

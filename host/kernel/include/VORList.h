@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cstddef>
 #include <unordered_set>
+#include <utility>
 #include <vector>
 
 #include "VORAssert.h"
@@ -19,6 +20,7 @@ class VORList {
   bool IsEmpty() const { return _items.empty(); }
 
   void Append(const T& value) { _items.push_back(value); }
+  void Append(T&& value) { _items.push_back(std::move(value)); }
   void Append(const VORList& other) {
     _items.insert(_items.end(), other._items.begin(), other._items.end());
   }

@@ -102,7 +102,7 @@ VORCallbackId VOREventPublisher::Add(const void* key, const std::string& name,
     _channels.push_back(std::make_unique<Channel>());
     channel = _channels.back().get();
     channel->name = name;
-    _channelNames.emplace_back(channel->name);
+    _channelNames.push_back({std::hash<std::string_view>()(channel->name), channel->name});
     if (!_channelIndex.empty()) {
       _channelIndex.emplace(channel->name, channel);
     } else if (_channels.size() > kChannelsSearchedInOrder) {
@@ -191,8 +191,9 @@ VOREventPublisher::Channel* VOREventPublisher::Find(std::string_view name) const
     auto it = _channelIndex.find(name);
     return it == _channelIndex.end() ? nullptr : it->second;
   }
+  const size_t hash = std::hash<std::string_view>()(name);
   for (size_t i = 0; i < _channelNames.size(); ++i) {
-    if (_channelNames[i] == name)
+    if (_channelNames[i].hash == hash && _channelNames[i].name == name)
       return _channels[i].get();
   }
   return nullptr;
