@@ -289,12 +289,15 @@ BENCHMARK(BM_PlainLongestPathLayering)
     ->Arg(100000)
     ->Unit(benchmark::kMillisecond);
 // Opening and organising at 1,000, 10,000 and 100,000 stations. The machine is shared and its
-// speed wanders: each size runs kRuns times on a level of its own, and the median is the figure.
-// Every run starts from a heap without free memory: closing the previous run's document gave it
-// back to the system.
+// speed wanders for tens of seconds at a time: each size runs kRuns times on a level of its own,
+// and the median is the figure. Run with --benchmark_enable_random_interleaving=true (as
+// scripts/bench does), the runs of the three sizes are shuffled together, so that a slow spell
+// reaches a few runs of every size rather than most runs of one, and the ratio of two sizes
+// compares runs made under the same conditions. Every run starts from a heap without free
+// memory: closing the previous run's document gave it back to the system.
 namespace {
 
-constexpr int kRuns = 5;
+constexpr int kRuns = 7;
 
 benchmark::internal::Benchmark* Runs(benchmark::internal::Benchmark* b, int iterations) {
   return b->Unit(benchmark::kMillisecond)
