@@ -153,3 +153,27 @@ TEST(EventPublisherTest, KeyedCallbacksRemovedDuringADispatchAreNotCalled) {
 }
 
 }  // namespace
+
+TEST(EventPublisherTest, NamesAgreeingInTheirFirstBytesOrInLengthAreToldApart) {
+  VORHandle<VOREventPublisher> publisher =
+      VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
+  Recorder r;
+  // Long names that differ only past their first bytes, one that is a prefix of another, two
+  // of one length, and the empty name.
+  const std::vector<std::string> names = {"ActivityModifiedNotification",
+                                          "ActivityModifiedNotificatioN",
+                                          "ActivityModified",
+                                          "ActivityModifiedX",
+                                          "ActivityModifiedY",
+                                          ""};
+  for (const std::string& name : names)
+    publisher->AddCallback(name, r.Callback("<" + name + ">"));
+  for (const std::string& name : names)
+    EXPECT_EQ(publisher->Dispatch(name, nullptr), 1) << name;
+  EXPECT_EQ(publisher->Dispatch("ActivityModifiedNotificationS", nullptr), 0);
+  EXPECT_EQ(publisher->Dispatch("ActivityModifie", nullptr), 0);
+  std::vector<std::string> expected;
+  for (const std::string& name : names)
+    expected.push_back("<" + name + ">:" + name);
+  EXPECT_EQ(r.calls, expected);
+}

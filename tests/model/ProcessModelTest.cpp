@@ -142,6 +142,27 @@ TEST(ItemAndResourceTest, ItemListsFilterByTypeAndModeAndResourcesByClass) {
   EXPECT_EQ(Utf8(VORISPPItem_var(l.gun)->GetDisplayName()), "Gun1");
 }
 
+TEST(ItemAndResourceTest, LinksAreFoundByTheirTypeFromBothEnds) {
+  SmallLine l;
+  VORISPPResourceManagement_var(l.weld)->AssignResource(l.gun);
+  VORILinkableObject_var weld(l.weld), s2(l.s2), gun(l.gun), panel(l.panel);
+  List* list = nullptr;
+  weld->GetPointedObjects(list, VORILinkableObject::ResourceLink);
+  EXPECT_EQ(Ids(list), IdOf(l.robot) + " " + IdOf(l.gun));
+  s2->GetPointedObjects(list, VORILinkableObject::ItemLink);
+  EXPECT_EQ(Ids(list), IdOf(l.panel));
+  s2->GetPointedObjects(list, VORILinkableObject::ResourceLink);
+  EXPECT_EQ(Ids(list), "");
+  weld->GetPointedObjects(list, "NoSuchLink");
+  EXPECT_EQ(Ids(list), "");
+  // A type spelt at run time, not the constant, finds the same links.
+  const std::string resourceLink = std::string("Assigned") + "Resource";
+  gun->GetPointingObjects(list, resourceLink.c_str());
+  EXPECT_EQ(Ids(list), IdOf(l.weld));
+  panel->GetPointingObjects(list, VORILinkableObject::ItemLink);
+  EXPECT_EQ(Ids(list), IdOf(l.s2));
+}
+
 TEST(ProductIOTest, InputsOutputsAndTheirItemsWithKinds29And39) {
   SmallLine l;
   ActivityRecorder rec(l.root);

@@ -22,22 +22,33 @@ void QELStatesInputListZitBltCmd::UpdateList(QELBaseScrollListZitBltRep* rep) {
   rep->RemoveAllItems(1);
   VORISPPFlowMgt_var flow(GetOwner());
   if (flow && VORISPPItemMgt_var(GetOwner())) {
-    // The activity's own inputs.
     VORScratchList assigned;
     GetFirstFirstAssignedItems(VORISPPActivity_var(GetOwner()), *assigned);
+    QELIBIWItemInfo_var info(GetOwner());
+    VORScratchList activities;
+    if (info)
+      info->AppendActivityList(*activities);
+    // A station without sub-activities is its own listed activity: its items are the ones just
+    // asked for, kept before its inputs take theirs out.
+    const bool listsItself =
+        activities->Size() == 1 &&
+        (*activities)[1].Identity() == VORBaseUnknown_var(GetOwner()).Identity();
+    VORScratchList collected;
+    if (listsItself)
+      collected->Append(*assigned);
+    // The activity's own inputs.
     QELAppendAssignedInputs(flow.get(), *assigned, rep, QELIListZitBltItemState::Direct);
     // What the sub-activities take from outside, once each.
-    if (QELIBIWItemInfo_var info(GetOwner()); info) {
-      VORScratchList activities;
+    if (activities->Size() > 0) {
       VORScratchList covered;
-      info->AppendActivityList(*activities);
       info->AppendCoveredItems(*covered);
       VORSmallSet<const void*> skip;
       for (const VORBaseUnknown_var& item : *covered)
         skip.Insert(item.Identity());
-      VORScratchList collected;
-      for (const VORBaseUnknown_var& activity : *activities)
-        GetFirstFirstAssignedItems(VORISPPActivity_var(activity), *collected);
+      if (!listsItself) {
+        for (const VORBaseUnknown_var& activity : *activities)
+          GetFirstFirstAssignedItems(VORISPPActivity_var(activity), *collected);
+      }
       for (const VORBaseUnknown_var& item : *collected) {
         if (VORISPPItem_var(item) && skip.Insert(item.Identity()))
           rep->AppendItem(item.get(), QELIListZitBltItemState::Listed);

@@ -25,6 +25,18 @@ std::map<const VORIDOMDocument*, std::pair<VORIDOMDocument_var, Cache>>& Answers
   return answers;
 }
 
+// The answer given last: every activity of a level asks for the same type, and a type name
+// compares in one step where the cache's tree would compare it at every level.
+struct LastAnswer {
+  const VORIDOMDocument* document = nullptr;
+  VORUnicodeString activityType;
+  const std::vector<QELZitBltDefinition>* definitions = nullptr;
+};
+LastAnswer& Last() {
+  static LastAnswer last;
+  return last;
+}
+
 const std::u16string& Xml(const char* text) {
   static std::map<std::string, std::u16string> converted;
   auto it = converted.find(text);
@@ -102,6 +114,10 @@ std::vector<QELZitBltDefinition> ReadDefinitions(const VORIDOMDocument_var& docu
 
 const std::vector<QELZitBltDefinition>& DefinitionsFor(const VORIDOMDocument_var& document,
                                                        const VORUnicodeString& activityType) {
+  LastAnswer& last = Last();
+  if (last.definitions != nullptr && last.document == document.get() &&
+      last.activityType == activityType)
+    return *last.definitions;
   auto& entry = Answers()[document.get()];
   if (!entry.first)
     entry.first = document;
@@ -109,6 +125,8 @@ const std::vector<QELZitBltDefinition>& DefinitionsFor(const VORIDOMDocument_var
   auto it = cache.find(activityType);
   if (it == cache.end())
     it = cache.emplace(activityType, ReadDefinitions(document, activityType)).first;
+  // A map's values stay where they are while it grows.
+  last = {document.get(), activityType, &it->second};
   return it->second;
 }
 
@@ -145,6 +163,7 @@ bool ParseConfigFile(const VORUnicodeString& path, VORIDOMDocument_var& document
 void ForgetForTests() {
   ZitBltDocument() = NULL_var;
   zitBltLoaded = false;
+  Last() = {};
   Answers().clear();
 }
 

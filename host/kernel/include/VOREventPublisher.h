@@ -68,12 +68,16 @@ class VOREventPublisher : public VORBaseUnknown {
   // A publisher has few names (a manipulator four, a model object a handful): they are searched
   // in order, and indexed by name only once there are many.
   std::vector<std::unique_ptr<Channel>> _channels;
-  // Their names side by side (views of each channel's own) with their hashes: a search reads
-  // one block and touches a channel's own name only when the hash agrees, instead of reading
-  // every channel of a publisher nobody touched lately.
+  // Their names side by side, each with its first bytes copied in: a search reads one block,
+  // and reads a channel's own name only for the rest of a long name that agrees that far,
+  // instead of reading every channel of a publisher nobody touched lately. Nor does it hash the
+  // name asked for: one pass over it, not two.
   struct ChannelName {
-    size_t hash;
-    std::string_view name;
+    static constexpr size_t kHeadSize = 16;
+    explicit ChannelName(std::string_view channelName);
+    bool Is(std::string_view wanted) const;
+    std::string_view name;  // the channel's own
+    char head[kHeadSize];
   };
   std::vector<ChannelName> _channelNames;
   std::unordered_map<std::string_view, Channel*> _channelIndex;

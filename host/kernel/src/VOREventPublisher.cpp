@@ -1,6 +1,7 @@
 #include "VOREventPublisher.h"
 
 #include <algorithm>
+#include <cstring>
 
 #include <absl/container/flat_hash_map.h>
 
@@ -102,7 +103,7 @@ VORCallbackId VOREventPublisher::Add(const void* key, const std::string& name,
     _channels.push_back(std::make_unique<Channel>());
     channel = _channels.back().get();
     channel->name = name;
-    _channelNames.push_back({std::hash<std::string_view>()(channel->name), channel->name});
+    _channelNames.emplace_back(channel->name);
     if (!_channelIndex.empty()) {
       _channelIndex.emplace(channel->name, channel);
     } else if (_channels.size() > kChannelsSearchedInOrder) {
@@ -191,12 +192,30 @@ VOREventPublisher::Channel* VOREventPublisher::Find(std::string_view name) const
     auto it = _channelIndex.find(name);
     return it == _channelIndex.end() ? nullptr : it->second;
   }
-  const size_t hash = std::hash<std::string_view>()(name);
   for (size_t i = 0; i < _channelNames.size(); ++i) {
-    if (_channelNames[i].hash == hash && _channelNames[i].name == name)
+    if (_channelNames[i].Is(name))
       return _channels[i].get();
   }
   return nullptr;
+}
+
+VOREventPublisher::ChannelName::ChannelName(std::string_view channelName)
+    : name(channelName), head{} {
+  if (!name.empty())
+    std::memcpy(head, name.data(), std::min(name.size(), kHeadSize));
+}
+
+bool VOREventPublisher::ChannelName::Is(std::string_view wanted) const {
+  if (wanted.size() != name.size())
+    return false;
+  if (wanted.empty())
+    return true;
+  const size_t inHead = std::min(wanted.size(), kHeadSize);
+  if (std::memcmp(head, wanted.data(), inHead) != 0)
+    return false;
+  return wanted.size() <= kHeadSize ||
+         std::memcmp(name.data() + kHeadSize, wanted.data() + kHeadSize,
+                     wanted.size() - kHeadSize) == 0;
 }
 
 int VOREventPublisher::Run(const std::string& event, VORNotification* notification, bool keyed,

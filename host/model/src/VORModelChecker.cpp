@@ -65,7 +65,7 @@ class Checker {
     std::unordered_set<std::string_view> seen;  // views of the objects' own ids
     for (VORModelObject* o : _objects) {
       if (o->id.empty())
-        Problem("an object of type '" + o->lateType + "' has no id");
+        Problem("an object of type '" + o->lateType.str() + "' has no id");
       else if (!seen.insert(o->id).second)
         Problem("id '" + o->id + "' is used twice");
       if (o->data != &_d)
@@ -156,11 +156,11 @@ class Checker {
     _targets.clear();
     for (const VORModelLink& l : o->out) {
       if (l.target == nullptr || _objects.count(l.target) == 0) {
-        Problem("dangling " + l.type + " link from '" + o->id + "'");
+        Problem("dangling " + l.type.str() + " link from '" + o->id + "'");
         continue;
       }
       _targets.push_back(l.target);
-      auto what = [&] { return l.type + " link '" + o->id + "' -> '" + l.target->id + "'"; };
+      auto what = [&] { return l.type.str() + " link '" + o->id + "' -> '" + l.target->id + "'"; };
       if (l.type == VORILinkableObject::ResourceLink) {
         auto* r = VORKindCast<VORProductImpl>(l.target);
         if (VORKindCast<VORActivityImpl>(o) == nullptr || r == nullptr || !r->isResource)

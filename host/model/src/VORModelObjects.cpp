@@ -30,6 +30,21 @@ bool VORMatchesFilter(VORModelObject* object, const char* filter) {
   return VORLateTypes::IsKindOf(object->lateType, std::string(f));
 }
 
+namespace VORSharedLinkTypes {
+const VORSharedName& Item() {
+  static const VORSharedName name(VORILinkableObject::ItemLink);
+  return name;
+}
+const VORSharedName& Resource() {
+  static const VORSharedName name(VORILinkableObject::ResourceLink);
+  return name;
+}
+const VORSharedName& IOItem() {
+  static const VORSharedName name(VORILinkableObject::IOItemLink);
+  return name;
+}
+}  // namespace VORSharedLinkTypes
+
 namespace {
 VORModelDoor* DoorOf(VORModelObject* o) {
   return o->data ? &o->data->door : nullptr;
@@ -65,13 +80,7 @@ void VORModelObject::DispatchEventKeyed(const void* key, const char* event,
 }
 
 HRESULT VORModelObject::GetTypeName(VORUnicodeString& typeName) {
-  // A model has a handful of late types, asked for again and again: each is decoded once and
-  // then shared (copies of a string share its code points).
-  thread_local std::unordered_map<std::string, VORUnicodeString> decoded;
-  auto it = decoded.find(lateType);
-  if (it == decoded.end())
-    it = decoded.emplace(lateType, VORUnicodeString(lateType)).first;
-  typeName = it->second;
+  typeName = lateType.Decoded();
   return S_OK;
 }
 
@@ -405,7 +414,7 @@ HRESULT VORActivityImpl::AppendAssignedItems(VORListValVORBaseUnknown_var& items
   const char* filter = (type == nullptr || *type == '\0') ? VORModelFilters::Item : type;
   auto collect = [&](VORActivityImpl* a) {
     for (const VORModelLink& l : a->out) {
-      if (l.type == VORILinkableObject::ItemLink && VORMatchesFilter(l.target, filter))
+      if (l.type == VORSharedLinkTypes::Item() && VORMatchesFilter(l.target, filter))
         AppendUnique(items, seen, l.target);
     }
   };
@@ -462,9 +471,9 @@ HRESULT VORActivityImpl::GetResources(VORListValVORBaseUnknown_var*& resources,
 HRESULT VORActivityImpl::AppendResources(VORListValVORBaseUnknown_var& resources,
                                          const char* filter) {
   const bool all =
-      filter == nullptr || *filter == '\0' || std::string(filter) == VORModelFilters::Resource;
+      filter == nullptr || *filter == '\0' || std::string_view(filter) == VORModelFilters::Resource;
   for (const VORModelLink& l : out) {
-    if (l.type != VORILinkableObject::ResourceLink)
+    if (l.type != VORSharedLinkTypes::Resource())
       continue;
     auto* p = static_cast<VORProductImpl*>(l.target);
     if (all || p->resourceClass == VORUnicodeString(filter))

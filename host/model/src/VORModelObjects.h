@@ -11,6 +11,7 @@
 
 #include "VORDynamicCast.h"
 #include "VORModel.h"
+#include "VORSharedName.h"
 
 struct VORDocumentData;
 class VORActivityImpl;
@@ -25,9 +26,16 @@ class VORContainerImpl;
 // made with (items only).
 struct VORModelLink {
   class VORModelObject* target = nullptr;
-  std::string type;
+  VORSharedName type;
   VORProductIOImpl* via = nullptr;
 };
+
+// The link types the model creates itself, shared: the hot loops compare them by address.
+namespace VORSharedLinkTypes {
+const VORSharedName& Item();
+const VORSharedName& Resource();
+const VORSharedName& IOItem();
+}  // namespace VORSharedLinkTypes
 
 // Kind bits of the implementation classes: a cheap exact cast in the hot loops (a
 // dynamic_cast across shared libraries compares type names).
@@ -53,7 +61,7 @@ class VORModelObject : public virtual VORIModelEvents,
   VOR_DECLARE_CLASS(VORModelObject, VORBaseUnknown)
  public:
   static constexpr unsigned KindMask = VORKindAll;
-  VORModelObject(std::string lateType, unsigned kind) : lateType(std::move(lateType)), kind(kind) {}
+  VORModelObject(VORSharedName lateType, unsigned kind) : lateType(lateType), kind(kind) {}
   bool Is(unsigned mask) const { return (kind & mask) != 0; }
 
   const char* GetLateType() const override { return lateType.c_str(); }
@@ -79,7 +87,7 @@ class VORModelObject : public virtual VORIModelEvents,
   int LinkIndex(const VORModelObject* target, const char* type) const;
 
   std::string id;
-  std::string lateType;
+  VORSharedName lateType;
   unsigned kind;
   VORDocumentData* data = nullptr;
   std::vector<VORModelLink> out;

@@ -8,7 +8,7 @@
 
 VORModelObject* VORProductIOImpl::Item() const {
   for (const VORModelLink& l : out) {
-    if (l.type == VORILinkableObject::IOItemLink)
+    if (l.type == VORSharedLinkTypes::IOItem())
       return l.target;
   }
   return nullptr;
