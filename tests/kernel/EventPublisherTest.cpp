@@ -152,8 +152,6 @@ TEST(EventPublisherTest, KeyedCallbacksRemovedDuringADispatchAreNotCalled) {
   EXPECT_EQ(p->DispatchKeyed(&a, "E"), 0);
 }
 
-}  // namespace
-
 TEST(EventPublisherTest, NamesAgreeingInTheirFirstBytesOrInLengthAreToldApart) {
   VORHandle<VOREventPublisher> publisher =
       VORHandle<VOREventPublisher>::Adopt(new VOREventPublisher());
@@ -177,3 +175,5 @@ TEST(EventPublisherTest, NamesAgreeingInTheirFirstBytesOrInLengthAreToldApart) {
     expected.push_back("<" + name + ">:" + name);
   EXPECT_EQ(r.calls, expected);
 }
+
+}  // namespace
