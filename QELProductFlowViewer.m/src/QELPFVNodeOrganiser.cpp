@@ -31,6 +31,9 @@ const VORTrace& Trace() {
 
 constexpr const char* kCatalog = "QELFpaProductFlowViewer";
 
+// How many lookups ahead a loop over a large level fetches its table entries.
+constexpr size_t kFetchAhead = 8;
+
 // Traced once per moved node: kept as a string rather than built from the literal each time.
 const std::string& DispatchNotifLine() {
   static const std::string line = "QELPFVNodeOrganiser::DispatchNotif -->";
@@ -89,27 +92,43 @@ void QELPFVNodeOrganiser::GenerateNodeIndexes() {
   if (_childNodeList == nullptr || _childNodeList->Size() != _levelList->Size())
     return;
   const int n = _childNodeList->Size();
-  // Index of each child (its first occurrence), by object identity, in one flat table: a lookup
-  // per flow, a cache miss each on a level of thousands when entries had a heap block each.
+  const auto count = static_cast<size_t>(n);
+  // The children and the far ends of their flows first, then the lookups: on a level far larger
+  // than the cache every lookup misses it, and a lookup known in advance can be fetched ahead.
+  std::vector<VORBaseUnknown*> identity(count);
+  std::vector<VORBaseUnknown*> ends;
+  ends.reserve(count * 2);
+  std::vector<size_t> firstEnd(count + 1);
+  for (size_t i = 0; i < count; ++i) {
+    const VORBaseUnknown_var& child = (*_childNodeList)[static_cast<int>(i) + 1];
+    identity[i] = child.Identity();
+    firstEnd[i] = ends.size();
+    if (VORISPPFlowMgt_var flows(child); flows)
+      flows->ForEachNextActivity([&ends](VORBaseUnknown* s) { ends.push_back(s); });
+  }
+  firstEnd[count] = ends.size();
+  // Index of each child (its first occurrence), by object identity.
   absl::flat_hash_map<VORBaseUnknown*, int> index;
-  index.reserve(static_cast<size_t>(n));
-  for (int i = 1; i <= n; ++i)
-    index.emplace((*_childNodeList)[i].Identity(), i - 1);
-  _successors.assign(static_cast<size_t>(n), {});
-  for (int i = 1; i <= n; ++i) {
-    VORISPPFlowMgt_var flows((*_childNodeList)[i]);
-    if (!flows)
-      continue;
-    std::vector<int>& succ = _successors[static_cast<size_t>(i - 1)];
-    flows->ForEachNextActivity([&](VORBaseUnknown* s) {
+  index.reserve(count);
+  for (size_t i = 0; i < count; ++i) {
+    if (i + kFetchAhead < count)
+      index.prefetch(identity[i + kFetchAhead]);
+    index.emplace(identity[i], static_cast<int>(i));
+  }
+  _successors.assign(count, {});
+  for (size_t i = 0; i < count; ++i) {
+    std::vector<int>& succ = _successors[i];
+    for (size_t e = firstEnd[i]; e < firstEnd[i + 1]; ++e) {
+      if (e + kFetchAhead < ends.size())
+        index.prefetch(ends[e + kFetchAhead]);
       // A successor is usually handed over as its identity; asking for the identity touches
-      // the successor, a cache miss on a large level. Live objects do not share addresses.
-      auto it = index.find(s);
+      // the successor. Live objects do not share addresses.
+      auto it = index.find(ends[e]);
       if (it == index.end())
-        it = index.find(s->GetIdentity());
+        it = index.find(ends[e]->GetIdentity());
       if (it != index.end())
         succ.push_back(it->second);
-    });
+    }
   }
   // The walk itself (raising successors, reporting nodes met again) runs on the indexes.
   const QELPFVLayoutCore::Levels levels = QELPFVLayoutCore::ComputeLevels(_successors);
@@ -253,7 +272,13 @@ template <class Moves>
 void QELPFVNodeOrganiser::PlaceColumn(VORListValVORBaseUnknown_var& list, double& x, double& y,
                                       float yStep, Moves moves) {
   const QELIPertNode_var noNode;
-  for (VORBaseUnknown_var& node : list) {
+  const int count = list.Size();
+  for (int k = 1; k <= count; ++k) {
+    // A move does enough for the next node's entry to arrive meanwhile, and not so much that
+    // a farther one would still be in the cache when its turn comes.
+    if (k < count && _controller != nullptr)
+      _controller->PrefetchNode(list[k + 1].get());
+    VORBaseUnknown_var& node = list[k];
     const bool move = moves(node);
     double snappedX = x;
     double snappedY = y;

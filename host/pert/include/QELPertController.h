@@ -63,6 +63,9 @@ class QELPertController : public VORCommand {
   // node is not in the chart.
   HRESULT MoveNodeTo(VORBaseUnknown_var& node, double x, double y, bool redraw,
                      VORBaseUnknown*& reference);
+  // For layouts that move many nodes: starts fetching the chart's entry of a node about to be
+  // moved, so that finding it then does not wait on memory. Changes nothing.
+  void PrefetchNode(VORBaseUnknown* node) const { _nodeIndex.prefetch(node); }
   void RemoveAllPertNodes();
   // Drops the node manipulator's subscriptions (before the controller is destroyed).
   void RemoveNodeManipCmdCB();
